@@ -1,0 +1,129 @@
+/*
+ * zoxcc: colour-conversion primitives for raster images.
+ *
+ * Every conversion takes row pointers, byte steps and a region size, converts the region and returns
+ * a zoxStatus: 0 success, negative an error (nothing written), positive a warning that comes with a
+ * finished result. The library keeps no state, opens no files, starts no threads and prints nothing.
+ *
+ * Conventions shared by all conversions:
+ *  - A step is the signed distance in bytes between the first pixels of two adjacent rows; row r
+ *    starts at the pointer plus r times the step. Zero and negative steps are legal and walk rows as
+ *    told (only the families that say so reject steps below 1).
+ *  - Planar sides pass an array of plane pointers; one step serves all planes of a side.
+ *  - Arguments are checked before anything is written: pointers, then sizes, then the rest, unless a
+ *    family says otherwise below.
+ *  - Many row kernels treat whole blocks of N pixels (counted from the row's first pixel) in a block
+ *    form and the pixels behind the last whole block in a remainder form; the two can differ by one
+ *    unit, so a pixel's value may depend on its column and on the width. Each family below says N.
+ *
+ * This header compiles as C and as C++.
+ */
+#ifndef ZOXCC_H
+#define ZOXCC_H
+
+#include <stdint.h>
+
+#if defined(__GNUC__)
+#define ZOXCC_API __attribute__((visibility("default")))
+#else
+#define ZOXCC_API
+#endif
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+/* ---- Status codes ---------------------------------------------------------------------------- */
+
+typedef int32_t zoxStatus;
+
+enum {
+    zoxStatusOk = 0,
+    zoxWarnNoOperation = 1,      /* nothing done, and no error (tone mapping of a negative source) */
+    zoxWarnOddSize = 35,         /* done on the part of the region its chroma sampling covers */
+    zoxStatusBadArgument = -5,   /* a CfaGrid outside 0..3 */
+    zoxStatusBadSize = -6,       /* width or height below the minimum, or another size out of range */
+    zoxStatusNullPointer = -8,   /* a pointer argument or an element of a pointer array is null */
+    zoxStatusNoMemory = -9,      /* a working buffer could not be allocated; destination untouched */
+    zoxStatusBadStep = -14,      /* a step below 1, where the family checks steps */
+    zoxStatusBadRange = -49,     /* the upper range limit is not above the lower one */
+    zoxStatusBadDitherLevels = -54,
+    zoxStatusBadNoise = -55,
+    zoxStatusBadDitherKind = -224
+};
+
+/* ---- Shared records ------------------------------------------------------------------------------ */
+
+/* A region of width by height pixels, passed by value. */
+typedef struct ImageSize {
+    int32_t width;
+    int32_t height;
+} ImageSize;
+
+typedef struct ImageRect {
+    int32_t x;
+    int32_t y;
+    int32_t width;
+    int32_t height;
+} ImageRect;
+
+/* The version record: constant data that lives as long as the library. */
+typedef struct LibraryVersion {
+    int32_t major;
+    int32_t minor;
+    int32_t update;
+    int32_t revision;
+    char targetCode[4];       /* "p8" and two zero bytes */
+    const char* name;
+    const char* versionText;
+    const char* buildDate;
+} LibraryVersion;
+
+/* Dither method of the bit-depth reduction functions. */
+typedef int32_t DitherKind;
+enum {
+    PlainQuantise = 0,
+    FloydSteinbergDiffusion = 1,
+    JarvisJudiceNinkeDiffusion = 2,
+    StuckiDiffusion = 3,
+    OrderedMatrix4x4 = 4
+};
+
+/* Colour layout of the 2x2 Bayer mosaic, anchored at the origin of the whole image:
+ * row 0 even/odd column, then row 1 even/odd column. */
+typedef int32_t CfaGrid;
+enum {
+    GridBlueGreen = 0, /* B G / G R */
+    GridRedGreen = 1,  /* R G / G B */
+    GridGreenBlue = 2, /* G B / R G */
+    GridGreenRed = 3   /* G R / B G */
+};
+
+/* ---- Version --------------------------------------------------------------------------------------- */
+
+/* Returns the version record; the record's name ends in "+" when the core services report feature 128. */
+ZOXCC_API const LibraryVersion* zoxccGetLibVersion(void);
+
+/* ---- RGB <-> YUV, 8u, full resolution ----------------------------------------------------------------
+ * Y = 0.299 R + 0.587 G + 0.114 B over the full range; U = 0.492 (B - Y) + 128, V = 0.877 (R - Y) + 128.
+ * C3: R,G,B (forward source) or Y,U,V (inverse source), lowest address first. AC4R: the destination's
+ * fourth byte is neither read nor written. AC4P4R: the source's fourth byte goes to plane 4 unchanged.
+ * C3C4R: alpha fills the fourth byte. Block widths N: RGBToYUV C3R 16, C3P3R 8, AC4P4R 8, P3R 16;
+ * YUVToRGB C3R 8, C3C4R 8, P3C3R 16; the AC4R forms and YUVToRGB P3R use one form in all columns.
+ * Checks: src/dst null, then sizes, then each plane pointer. Steps are not examined. */
+ZOXCC_API zoxStatus zoxiRGBToYUV_8u_C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYUV_8u_AC4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYUV_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYUV_8u_AC4P4R(const uint8_t* src, int srcStep, uint8_t* const dst[4], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYUV_8u_P3R(const uint8_t* const src[3], int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUVToRGB_8u_C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUVToRGB_8u_AC4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUVToRGB_8u_C3C4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYUVToRGB_8u_P3C3R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUVToRGB_8u_P3R(const uint8_t* const src[3], int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+
+#ifdef __cplusplus
+}
+#endif
+
+#endif /* ZOXCC_H */

@@ -1,0 +1,33 @@
+// The fixed-point vocabulary of the per-pixel forms, in plain scalar C++, with the exact semantics of the
+// 16-bit lane instructions they stand for. Arguments are the lane values; results are ints.
+#pragma once
+
+#include <cstdint>
+
+namespace zox {
+
+// floor(a * k / 65536) of two signed 16-bit values: the upper half of the signed product.
+constexpr int mulHigh(int a, int k)
+{
+    return (a * k) >> 16;
+}
+
+// The same for two unsigned 16-bit values.
+constexpr int mulHighU(int a, int k)
+{
+    return static_cast<int>((static_cast<uint32_t>(a) * static_cast<uint32_t>(k)) >> 16);
+}
+
+// floor((a * k + 16384) / 32768): the rounded upper half of a signed product.
+constexpr int mulRound(int a, int k)
+{
+    return (a * k + 16384) >> 15;
+}
+
+// Limits x to 0..255 (an unsigned saturating pack).
+constexpr uint8_t clip8(int x)
+{
+    return static_cast<uint8_t>(x < 0 ? 0 : (x > 255 ? 255 : x));
+}
+
+} // namespace zox

@@ -1,0 +1,154 @@
+// RGB <-> YUV at full resolution: the coefficient sets and the per-pixel forms.
+//
+// Y = 0.299 R + 0.587 G + 0.114 B at full range, U = 0.492 (B - Y) + 128, V = 0.877 (R - Y) + 128.
+// Every form is one pixel in, one pixel out; the block forms are the arithmetic of the 16-bit lane
+// kernels and differ from the remainder forms by at most one unit.
+#pragma once
+
+#include "frame/layouts.hpp"
+#include "frame/ops.hpp"
+
+namespace zox {
+
+// ---- coefficient sets -------------------------------------------------------------------------------
+
+// Y in 1/65536 (unsigned gains on 256 x sample), U and V in 1/32768 (signed gains on 128 x sample).
+struct YuvMatrixForward {
+    static constexpr int yR = 19595, yG = 38469, yB = 7471;
+    static constexpr int uR = -4816, uG = -9469, uB = 14286;
+    static constexpr int vR = 20152, vG = -16875, vB = -3276;
+};
+// The three luma weights sum to 65536 (38470 for green); chroma gains act on B - Y and R - Y.
+struct YuvDifferenceForward {
+    static constexpr int yR = 19595, yG = 38470, yB = 7471;
+    static constexpr int uGain = 32244, vGain = 57475;
+};
+// All in 1/32768; chroma gains act on 2B - 2Y and 2R - 2Y.
+struct YuvHalfForward {
+    static constexpr int yR = 9798, yG = 19235, yB = 3736;
+    static constexpr int uGain = 16121, vGain = 28737;
+};
+
+// Gains of (U - 128) and (V - 128) for the inverse direction.
+struct YuvInverseGains {
+    int vR, uG, vG, uB;
+};
+inline constexpr YuvInverseGains YuvInverseRounded{74711, -25821, -38076, 133169};   // 1/65536
+inline constexpr YuvInverseGains YuvInverseTruncated{74710, -25820, -38075, 133168}; // 1/65536
+inline constexpr YuvInverseGains YuvInverseBlock8{9339, -3228, -4760, 16646};        // 1/8192
+inline constexpr YuvInverseGains YuvInverseBlock16{9338, -3227, -4759, 16645};       // 1/8192
+inline constexpr YuvInverseGains YuvInverseBlock128{4669, -1614, -2380, 8323};       // 1/4096
+
+// ---- forward forms ----------------------------------------------------------------------------------
+
+// Matrix block form: each product truncated before the sum; Y never exceeds 254 here.
+struct YuvFromRgbMatrix {
+    using K = YuvMatrixForward;
+    static Px apply(const Px& p)
+    {
+        const int r = p.c[0], g = p.c[1], b = p.c[2];
+        const int y = (mulHighU(256 * r, K::yR) + mulHighU(256 * g, K::yG) + mulHighU(256 * b, K::yB)) >> 8;
+        const int u = ((mulHigh(128 * r, K::uR) + mulHigh(128 * g, K::uG) + mulHigh(128 * b, K::uB)) >> 6) + 128;
+        const int v = ((mulHigh(128 * r, K::vR) + mulHigh(128 * g, K::vG) + mulHigh(128 * b, K::vB)) >> 6) + 128;
+        return {{y, clip8(u), clip8(v)}, p.extra};
+    }
+};
+
+// Half block form: s is twice the luma plus the rounding unit, and the differences subtract it.
+struct YuvFromRgbHalf {
+    using K = YuvHalfForward;
+    static Px apply(const Px& p)
+    {
+        const int r = p.c[0], g = p.c[1], b = p.c[2];
+        const int s = mulHigh(4 * r, K::yR) + mulHigh(4 * b, K::yB) + mulHigh(4 * g, K::yG) + 1;
+        return {{clip8(s >> 1), clip8(mulHigh(2 * b - s, K::uGain) + 128), clip8(mulHigh(2 * r - s, K::vGain) + 128)},
+                p.extra};
+    }
+};
+
+// Difference remainder form, with full rounding (FullRound) or low rounding.
+template <bool FullRound>
+struct YuvFromRgbDifference {
+    using K = YuvDifferenceForward;
+    static Px apply(const Px& p)
+    {
+        const int r = p.c[0], g = p.c[1], b = p.c[2];
+        const int t = K::yR * r + K::yG * g + K::yB * b;
+        const int yBias = FullRound ? 32768 : 0;
+        const int dBias = FullRound ? 32768 : 32767;
+        const int y = (t + yBias) >> 16;
+        const int dB = (65536 * b - t + dBias) >> 16;
+        const int dR = (65536 * r - t + dBias) >> 16;
+        // U cannot leave 0..255; V can, since R - Y reaches +-179.
+        return {{y, ((K::uGain * dB) >> 16) + 128, clip8(((K::vGain * dR) >> 16) + 128)}, p.extra};
+    }
+};
+using YuvFromRgbDifferenceFull = YuvFromRgbDifference<true>;
+using YuvFromRgbDifferenceLow = YuvFromRgbDifference<false>;
+
+// Plane remainder form: the matrix gains applied to whole samples.
+struct YuvFromRgbPlane {
+    using K = YuvMatrixForward;
+    static Px apply(const Px& p)
+    {
+        const int r = p.c[0], g = p.c[1], b = p.c[2];
+        const int y = (K::yR * r + K::yG * g + K::yB * b) >> 16;
+        const int u = ((K::uR * r + K::uG * g + K::uB * b) >> 15) + 128;
+        const int v = ((K::vR * r + K::vG * g + K::vB * b) >> 15) + 128;
+        return {{y, u, clip8(v)}, p.extra};
+    }
+};
+
+// ---- inverse forms ----------------------------------------------------------------------------------
+
+// Block 8: chroma scaled by 8, gains in 1/8192.
+struct RgbFromYuvBlock8 {
+    static constexpr YuvInverseGains K = YuvInverseBlock8;
+    static Px apply(const Px& p)
+    {
+        const int y = p.c[0], a = 8 * (p.c[1] - 128), b = 8 * (p.c[2] - 128);
+        return {{clip8(y + mulHigh(b, K.vR)), clip8(y + mulHigh(a, K.uG) + mulHigh(b, K.vG)), clip8(y + mulHigh(a, K.uB))},
+                p.extra};
+    }
+};
+
+// Block 16: chroma scaled by 16, luma doubled, the sum halved.
+struct RgbFromYuvBlock16 {
+    static constexpr YuvInverseGains K = YuvInverseBlock16;
+    static Px apply(const Px& p)
+    {
+        const int y2 = 2 * p.c[0], a = 16 * (p.c[1] - 128), b = 16 * (p.c[2] - 128);
+        return {{clip8((y2 + mulHigh(b, K.vR)) >> 1), clip8((y2 + mulHigh(a, K.uG) + mulHigh(b, K.vG)) >> 1),
+                 clip8((y2 + mulHigh(a, K.uB)) >> 1)},
+                p.extra};
+    }
+};
+
+// Block 128: chroma scaled by 128, luma by 8, rounded. Green subtracts products formed with positive
+// gains, so each of its floors falls the other way from a negative gain.
+struct RgbFromYuvBlock128 {
+    static constexpr YuvInverseGains K = YuvInverseBlock128;
+    static Px apply(const Px& p)
+    {
+        const int y8 = 8 * p.c[0], a = 128 * (p.c[1] - 128), b = 128 * (p.c[2] - 128);
+        return {{clip8((y8 + mulHigh(b, K.vR) + 4) >> 3), clip8((y8 - mulHigh(b, -K.vG) - mulHigh(a, -K.uG) + 4) >> 3),
+                 clip8((y8 + mulHigh(a, K.uB) + 4) >> 3)},
+                p.extra};
+    }
+};
+
+// Whole-sample forms in 1/65536: rounded (green rounded only when GreenRound) or truncated.
+template <const YuvInverseGains& K, int RB, int G>
+struct RgbFromYuvPixel {
+    static Px apply(const Px& p)
+    {
+        const int y = 65536 * p.c[0], u = p.c[1] - 128, v = p.c[2] - 128;
+        return {{clip8((y + K.vR * v + RB) >> 16), clip8((y + K.uG * u + K.vG * v + G) >> 16), clip8((y + K.uB * u + RB) >> 16)},
+                p.extra};
+    }
+};
+using RgbFromYuvRoundedGreenLow = RgbFromYuvPixel<YuvInverseRounded, 32768, 0>;
+using RgbFromYuvRounded = RgbFromYuvPixel<YuvInverseRounded, 32768, 32768>;
+using RgbFromYuvTruncated = RgbFromYuvPixel<YuvInverseTruncated, 0, 0>;
+
+} // namespace zox

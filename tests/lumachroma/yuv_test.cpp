@@ -1,0 +1,103 @@
+// Values that pin the roundings and column rules of RGB <-> YUV.
+#include "lumachroma/yuv_forms.hpp"
+#include "zoxcc.h"
+
+#include <gtest/gtest.h>
+
+#include <array>
+#include <vector>
+
+using namespace zox;
+
+namespace {
+
+using Triple = std::array<int, 3>;
+
+template <class Form>
+Triple run(Triple in)
+{
+    const Px p = Form::apply(Px{{in[0], in[1], in[2]}, 0});
+    return {p.c[0], p.c[1], p.c[2]};
+}
+
+// The pixel `in` at column `x` of a one-row C3 image of width `w`, all other pixels black.
+template <class F>
+Triple atColumn(F f, Triple in, int x, int w)
+{
+    std::vector<uint8_t> src(3 * w, 0), dst(3 * w, 0);
+    for (int k = 0; k < 3; ++k)
+        src[3 * x + k] = static_cast<uint8_t>(in[k]);
+    EXPECT_EQ(f(src.data(), 3 * w, dst.data(), 3 * w, ImageSize{w, 1}), zoxStatusOk);
+    return {dst[3 * x], dst[3 * x + 1], dst[3 * x + 2]};
+}
+
+} // namespace
+
+TEST(YuvForms, WhiteAndBlackInEveryForwardForm)
+{
+    struct Row {
+        const char* form;
+        Triple white, black;
+    } rows[] = {
+        {"matrix", run<YuvFromRgbMatrix>({255, 255, 255}), run<YuvFromRgbMatrix>({0, 0, 0})},
+        {"difference low", run<YuvFromRgbDifferenceLow>({255, 255, 255}), run<YuvFromRgbDifferenceLow>({0, 0, 0})},
+        {"difference full", run<YuvFromRgbDifferenceFull>({255, 255, 255}), run<YuvFromRgbDifferenceFull>({0, 0, 0})},
+        {"plane", run<YuvFromRgbPlane>({255, 255, 255}), run<YuvFromRgbPlane>({0, 0, 0})},
+        {"half", run<YuvFromRgbHalf>({255, 255, 255}), run<YuvFromRgbHalf>({0, 0, 0})},
+    };
+    const Triple wantWhite[] = {{254, 127, 127}, {255, 128, 128}, {255, 128, 128}, {254, 128, 128}, {255, 128, 128}};
+    const Triple wantBlack[] = {{0, 128, 128}, {0, 128, 128}, {0, 128, 128}, {0, 128, 128}, {0, 127, 127}};
+    for (int i = 0; i < 5; ++i) {
+        EXPECT_EQ(rows[i].white, wantWhite[i]) << rows[i].form;
+        EXPECT_EQ(rows[i].black, wantBlack[i]) << rows[i].form;
+    }
+}
+
+TEST(YuvExports, ColumnDecidesTheForm)
+{
+    // Pure green: 150 with full rounding (AC4R), 149 at a remainder column of C3R.
+    uint8_t ac4[4] = {0, 255, 0, 77}, out[4] = {0, 0, 0, 91};
+    ASSERT_EQ(zoxiRGBToYUV_8u_AC4R(ac4, 4, out, 4, ImageSize{1, 1}), zoxStatusOk);
+    EXPECT_EQ(out[0], 150);
+    EXPECT_EQ(out[3], 91);
+    EXPECT_EQ(atColumn(zoxiRGBToYUV_8u_C3R, {0, 255, 0}, 0, 1)[0], 149);
+    // White: block column 254,127,127; remainder column 255,128,128 (width 17: column 16 is behind the block).
+    EXPECT_EQ(atColumn(zoxiRGBToYUV_8u_C3R, {255, 255, 255}, 15, 17), (Triple{254, 127, 127}));
+    EXPECT_EQ(atColumn(zoxiRGBToYUV_8u_C3R, {255, 255, 255}, 16, 17), (Triple{255, 128, 128}));
+    // (128, 255, 255) back to RGB: green 3 in a block, 4 at a remainder column.
+    EXPECT_EQ(atColumn(zoxiYUVToRGB_8u_C3R, {128, 255, 255}, 0, 8)[1], 3);
+    EXPECT_EQ(atColumn(zoxiYUVToRGB_8u_C3R, {128, 255, 255}, 0, 7)[1], 4);
+}
+
+TEST(YuvForms, GrayStaysGrayInEveryInverseForm)
+{
+    for (int y = 0; y < 256; ++y) {
+        const Triple gray{y, y, y};
+        for (Triple got : {run<RgbFromYuvBlock8>({y, 128, 128}), run<RgbFromYuvBlock16>({y, 128, 128}),
+                           run<RgbFromYuvBlock128>({y, 128, 128}), run<RgbFromYuvRounded>({y, 128, 128}),
+                           run<RgbFromYuvRoundedGreenLow>({y, 128, 128}), run<RgbFromYuvTruncated>({y, 128, 128})})
+            ASSERT_EQ(got, gray) << "Y " << y;
+    }
+}
+
+// Block and remainder form of one export differ by at most one unit in each channel.
+template <class Block, class Rem>
+void expectWithinOne(const char* what)
+{
+    for (int i = 0; i < (1 << 24); i += 7) {
+        const Triple in{i >> 16, (i >> 8) & 255, i & 255};
+        const Triple a = run<Block>(in), b = run<Rem>(in);
+        for (int k = 0; k < 3; ++k)
+            ASSERT_LE(std::abs(a[k] - b[k]), 1) << what << " input " << in[0] << "," << in[1] << "," << in[2];
+    }
+}
+
+TEST(YuvForms, BlockAndRemainderWithinOne)
+{
+    expectWithinOne<YuvFromRgbMatrix, YuvFromRgbDifferenceLow>("RGBToYUV C3R");
+    expectWithinOne<YuvFromRgbHalf, YuvFromRgbDifferenceFull>("RGBToYUV AC4P4R");
+    expectWithinOne<YuvFromRgbMatrix, YuvFromRgbPlane>("RGBToYUV P3R");
+    expectWithinOne<RgbFromYuvBlock8, RgbFromYuvRoundedGreenLow>("YUVToRGB C3R");
+    expectWithinOne<RgbFromYuvBlock128, RgbFromYuvRounded>("YUVToRGB C3C4R");
+    expectWithinOne<RgbFromYuvBlock16, RgbFromYuvTruncated>("YUVToRGB P3C3R");
+}

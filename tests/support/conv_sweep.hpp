@@ -1,0 +1,282 @@
+// Harness for the generic conversions: guarded sides built from a layout, the column-rule walker that
+// uses scalar forms only, the export sweep, the validation rows and the block-kernel differential.
+#pragma once
+
+#include "frame/conv.hpp"
+#include "support/guarded.hpp"
+
+#include <gtest/gtest.h>
+
+#include <memory>
+#include <string>
+#include <type_traits>
+#include <vector>
+
+namespace zt {
+
+// The planes of one side of a call.
+template <class L>
+struct Side {
+    std::vector<std::unique_ptr<Plane>> planes;
+    std::vector<uint8_t*> ptrs;
+    int step = 0;
+
+    Side(int rows, int width, int step_, int misalign, Rng& rng) : step(step_)
+    {
+        for (int p = 0; p < L::planes; ++p) {
+            // Planes of one side share the step but not their alignment.
+            const int m = misalign < 0 ? -1 : (misalign + 5 * p) % 16;
+            planes.push_back(std::make_unique<Plane>(PlaneSpec{rows, width * L::bytesPerPixel, step, m}, rng));
+            ptrs.push_back(planes.back()->data());
+        }
+    }
+    typename L::Arg arg()
+    {
+        if constexpr (L::planes == 1 && std::is_pointer_v<typename L::Arg> &&
+                      !std::is_pointer_v<std::remove_pointer_t<typename L::Arg>>)
+            return ptrs[0];
+        else
+            return ptrs.data();
+    }
+    std::vector<std::vector<uint8_t>> bytes() const
+    {
+        std::vector<std::vector<uint8_t>> b;
+        for (const auto& p : planes)
+            b.push_back(p->bytes());
+        return b;
+    }
+    void restore(const std::vector<std::vector<uint8_t>>& b)
+    {
+        for (std::size_t i = 0; i < planes.size(); ++i)
+            planes[i]->restore(b[i]);
+    }
+};
+
+// The column rule, with scalar forms only: block form below the width rounded down to N.
+template <class C>
+void walk(Side<typename C::Src>& src, Side<typename C::Dst>& dst, ImageSize roi, const zox::Ctx& ctx)
+{
+    using Src = typename C::Src;
+    using Dst = typename C::Dst;
+    const int nb = C::N > 1 ? roi.width / C::N * C::N : 0;
+    for (int r = 0; r < roi.height; ++r) {
+        const auto s = Src::row(src.arg(), src.step, r);
+        const auto d = Dst::row(dst.arg(), dst.step, r);
+        for (int x = 0; x < roi.width; ++x) {
+            const zox::Px px = Src::load(s, x);
+            if constexpr (C::N > 1)
+                if (x < nb) {
+                    Dst::store(d, x, C::Block::apply(px), ctx);
+                    continue;
+                }
+            Dst::store(d, x, C::Rem::apply(px), ctx);
+        }
+    }
+}
+
+template <class F, class C>
+constexpr bool takesAlpha = std::is_invocable_v<F, typename C::Src::Arg, int, typename C::Dst::Arg, int, ImageSize, uint8_t>;
+
+template <class C, class F>
+zoxStatus callExport(F f, typename C::Src::Arg s, int ss, typename C::Dst::Arg d, int ds, ImageSize roi, uint8_t alpha)
+{
+    if constexpr (takesAlpha<F, C>)
+        return f(s, ss, d, ds, roi, alpha);
+    else
+        return f(s, ss, d, ds, roi);
+}
+
+struct SweepCase {
+    int width, height, stepKind, misalign;
+};
+
+// One call of the export against the walker on a copy of the same destination.
+template <class C, class F>
+void checkCase(const char* name, F f, const SweepCase& k, Rng& rng)
+{
+    using Src = typename C::Src;
+    using Dst = typename C::Dst;
+    const ImageSize roi{k.width, k.height};
+    Side<Src> src(k.height, k.width, pickStep(k.stepKind, k.height, k.width * Src::bytesPerPixel, rng), k.misalign, rng);
+    Side<Dst> dst(k.height, k.width, pickStep(k.stepKind, k.height, k.width * Dst::bytesPerPixel, rng), (k.misalign * 7 + 3) % 16, rng);
+    Side<Dst> want(k.height, k.width, dst.step, (k.misalign * 7 + 3) % 16, rng);
+    const auto srcBefore = src.bytes();
+    const auto dstBefore = dst.bytes();
+    want.restore(dstBefore);
+    const uint8_t alpha = static_cast<uint8_t>(rng());
+    const zox::Ctx ctx{alpha};
+
+    SCOPED_TRACE(std::string(name) + " width " + std::to_string(k.width) + " height " + std::to_string(k.height) +
+                 " steps " + std::to_string(src.step) + "/" + std::to_string(dst.step) + " misalign " +
+                 std::to_string(k.misalign));
+    ASSERT_EQ(callExport<C>(f, src.arg(), src.step, dst.arg(), dst.step, roi, alpha), zoxStatusOk);
+    walk<C>(src, want, roi, ctx);
+
+    ASSERT_EQ(src.bytes(), srcBefore) << "the source changed";
+    for (int p = 0; p < Dst::planes; ++p) {
+        const long g = dst.planes[p]->firstGuardChange(dstBefore[p]);
+        ASSERT_EQ(g, -1) << "plane " << p << ": byte outside the region written";
+        const auto got = dst.planes[p]->bytes();
+        const auto exp = want.planes[p]->bytes();
+        for (std::size_t i = 0; i < got.size(); ++i)
+            ASSERT_EQ(int(got[i]), int(exp[i])) << "plane " << p << " byte " << i;
+    }
+    if constexpr (requires { Dst::fourth; })
+        if constexpr (Dst::fourth == zox::Fourth::Keep)
+            for (int r = 0; r < k.height; ++r)
+                for (int x = 0; x < k.width; ++x) {
+                    const std::size_t off = static_cast<std::size_t>(dst.planes[0]->row(r) + 4 * x + 3 - dst.planes[0]->blockBegin());
+                    ASSERT_EQ(dst.planes[0]->bytes()[off], dstBefore[0][off]) << "fourth byte of pixel " << x;
+                }
+}
+
+// Widths 1..70, heights 1..3, every step kind, misalignments cycling through 0..15 and page-end.
+template <class C, class F>
+void sweepExport(const char* name, F f)
+{
+    Rng rng(12345);
+    for (int w = 1; w <= 70; ++w)
+        for (int h = 1; h <= 3; ++h)
+            for (int kind = 0; kind < 3; ++kind) {
+                if (kind == 1 && h == 1)
+                    continue;
+                const int mis = (w + 3 * h + kind) % 17 - 1; // -1: the region ends the mapping
+                checkCase<C>(name, f, SweepCase{w, h, kind, mis}, rng);
+                if (::testing::Test::HasFatalFailure())
+                    return;
+            }
+}
+
+// Validation rows: each bad argument alone and in the combinations whose order matters; nothing written.
+template <class C, class F>
+void checkValidation(const char* name, F f)
+{
+    using Src = typename C::Src;
+    using Dst = typename C::Dst;
+    Rng rng(7);
+    Side<Src> src(2, 8, 64, 0, rng);
+    Side<Dst> dst(2, 8, 64, 0, rng);
+    const auto before = dst.bytes();
+    const bool planesFirst = C::checks == zox::Checks::PointersPlanesSizes;
+    struct Row {
+        const char* what;
+        int srcNull, dstNull; // -1 none, 0.. plane index, 9 the pointer itself
+        ImageSize roi;
+        zoxStatus want;
+    };
+    std::vector<Row> rows = {
+        {"src null", 9, -1, {8, 2}, zoxStatusNullPointer},
+        {"dst null", -1, 9, {8, 2}, zoxStatusNullPointer},
+        {"width 0", -1, -1, {0, 2}, zoxStatusBadSize},
+        {"height 0", -1, -1, {8, 0}, zoxStatusBadSize},
+        {"width -1", -1, -1, {-1, 2}, zoxStatusBadSize},
+        {"src null, width 0", 9, -1, {0, 2}, zoxStatusNullPointer},
+        {"dst null, height -5", -1, 9, {8, -5}, zoxStatusNullPointer},
+    };
+    for (int p = 0; p < Src::planes && Src::planes > 1; ++p) {
+        rows.push_back({"src plane null", p, -1, {8, 2}, zoxStatusNullPointer});
+        rows.push_back({"src plane null, width 0", p, -1, {0, 2}, planesFirst ? zoxStatusNullPointer : zoxStatusBadSize});
+    }
+    for (int p = 0; p < Dst::planes && Dst::planes > 1; ++p) {
+        rows.push_back({"dst plane null", -1, p, {8, 2}, zoxStatusNullPointer});
+        rows.push_back({"dst plane null, height 0", -1, p, {8, 0}, planesFirst ? zoxStatusNullPointer : zoxStatusBadSize});
+    }
+    for (const Row& row : rows) {
+        SCOPED_TRACE(std::string(name) + ": " + row.what);
+        auto sp = src.ptrs;
+        auto dp = dst.ptrs;
+        if (row.srcNull >= 0 && row.srcNull < 9)
+            sp[row.srcNull] = nullptr;
+        if (row.dstNull >= 0 && row.dstNull < 9)
+            dp[row.dstNull] = nullptr;
+        typename Src::Arg sa;
+        typename Dst::Arg da;
+        if constexpr (Src::planes == 1 && !std::is_pointer_v<std::remove_pointer_t<typename Src::Arg>>)
+            sa = sp[0];
+        else
+            sa = sp.data();
+        if constexpr (Dst::planes == 1 && !std::is_pointer_v<std::remove_pointer_t<typename Dst::Arg>>)
+            da = dp[0];
+        else
+            da = dp.data();
+        if (row.srcNull == 9)
+            sa = nullptr;
+        if (row.dstNull == 9)
+            da = nullptr;
+        EXPECT_EQ(callExport<C>(f, sa, src.step, da, dst.step, row.roi, 0), row.want);
+        EXPECT_EQ(dst.bytes(), before) << "written before validation passed";
+    }
+}
+
+// Writes one source pixel through the layout's own byte positions.
+template <class L>
+void putPx(const typename L::Row& row, int x, int c0, int c1, int c2, int extra)
+{
+    const int c[3] = {c0, c1, c2};
+    if constexpr (L::planes == 1) {
+        uint8_t* q = const_cast<uint8_t*>(row.p[0]) + static_cast<std::size_t>(x) * L::bytesPerPixel;
+        for (int k = 0; k < 3; ++k)
+            q[zox::channelByte(L::order, k)] = static_cast<uint8_t>(c[k]);
+        if constexpr (L::bytesPerPixel == 4)
+            q[3] = static_cast<uint8_t>(extra);
+    } else {
+        for (int k = 0; k < 3; ++k)
+            const_cast<uint8_t*>(row.p[k])[x] = static_cast<uint8_t>(c[k]);
+        if constexpr (L::planes == 4)
+            const_cast<uint8_t*>(row.p[3])[x] = static_cast<uint8_t>(extra);
+    }
+}
+
+#if defined(ZOX_ISA_SSE41)
+// The SIMD block kernel against the scalar block kernel: block counts 1..12 and random, every
+// misalignment of source and destination, buffers ending at a PROT_NONE page, random and corner data;
+// then every possible three-channel input once.
+template <class C>
+void diffKernel()
+{
+    using Src = typename C::Src;
+    using Dst = typename C::Dst;
+    if constexpr (C::N > 1) {
+        Rng rng(99);
+        const int corners[] = {0, 1, 127, 128, 129, 254, 255};
+        auto run = [&](Side<Src>& src, int n, int dstMis) {
+            Side<Dst> a(1, n, n * Dst::bytesPerPixel, dstMis, rng);
+            Side<Dst> b(1, n, n * Dst::bytesPerPixel, dstMis, rng);
+            b.restore(a.bytes());
+            const zox::Ctx ctx{static_cast<uint8_t>(rng())};
+            const auto s = Src::row(src.arg(), src.step, 0);
+            zox::sse41::blocks<C>(s, Dst::row(a.arg(), a.step, 0), n, ctx);
+            zox::scalarBlocks<C>(s, Dst::row(b.arg(), b.step, 0), n, ctx);
+            for (int p = 0; p < Dst::planes; ++p)
+                ASSERT_EQ(a.planes[p]->bytes(), b.planes[p]->bytes()) << "n " << n << " plane " << p;
+        };
+        for (int blocks = 1; blocks <= 14; ++blocks) {
+            const int n = (blocks <= 12 ? blocks : 1 + static_cast<int>(rng() % 40)) * C::N;
+            for (int mis = -1; mis < 16; ++mis) {
+                Side<Src> src(1, n, n * Src::bytesPerPixel, mis, rng);
+                if (mis % 4 == 0) { // corner values in every channel
+                    const auto row = Src::row(src.arg(), src.step, 0);
+                    for (int x = 0; x < n; ++x)
+                        putPx<Src>(row, x, corners[rng() % 7], corners[rng() % 7], corners[rng() % 7], static_cast<int>(rng() & 255));
+                }
+                run(src, n, (mis * 5 + 16) % 17 - 1);
+                if (::testing::Test::HasFatalFailure())
+                    return;
+            }
+        }
+        // Every input: one row of 65536 pixels for each value of the first channel.
+        const int n = 65536 / C::N * C::N;
+        Side<Src> src(1, 65536, 65536 * Src::bytesPerPixel, 0, rng);
+        const auto row = Src::row(src.arg(), src.step, 0);
+        for (int c0 = 0; c0 < 256; ++c0) {
+            for (int i = 0; i < 65536; ++i)
+                putPx<Src>(row, i, c0, i >> 8, i & 255, (i * 7) & 255);
+            run(src, n, c0 % 16);
+            if (::testing::Test::HasFatalFailure())
+                return;
+        }
+    }
+}
+#endif
+
+} // namespace zt
