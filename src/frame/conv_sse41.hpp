@@ -6,7 +6,6 @@
 #include "frame/conv.hpp"
 #include "frame/ops_sse41.hpp"
 
-#include <array>
 #include <cstring>
 
 namespace zox::sse41 {
@@ -21,14 +20,14 @@ struct V3 {
 template <class Form>
 struct Simd;
 
-using Bytes16 = std::array<int, 16>;
+// Sixteen shuffle-control bytes as constant data (-1: a zero byte).
+struct alignas(16) Bytes16 {
+    int8_t b[16];
+};
 
-inline V maskOf(const Bytes16& idx)
+inline V maskOf(const Bytes16& m)
 {
-    int a[16];
-    for (int i = 0; i < 16; ++i)
-        a[i] = idx[i];
-    return shuffleMask(a);
+    return _mm_load_si128(reinterpret_cast<const V*>(m.b));
 }
 
 // Gather mask that takes, for lane i, the byte at `first + stride * i - base` of a 16-byte register,
@@ -38,45 +37,50 @@ constexpr Bytes16 gatherMask(int first, int stride, int base)
     Bytes16 m{};
     for (int i = 0; i < 8; ++i) {
         const int b = first + stride * i - base;
-        m[2 * i] = (b >= 0 && b < 16) ? b : -1;
-        m[2 * i + 1] = -1;
+        m.b[2 * i] = static_cast<int8_t>((b >= 0 && b < 16) ? b : -1);
+        m.b[2 * i + 1] = -1;
     }
     return m;
 }
 
 // Scatter mask for output bytes base..base+15 of an interleaved row of Bpp bytes a pixel, taking slot
-// `slot` of each pixel from a register whose bytes hold channel `ch` lane i at byte `at + i`.
+// `slot` of each pixel from a register that holds lane i of the slot's channel at byte `at + i`.
 constexpr Bytes16 scatterMask(int Bpp, int base, int slot, int at)
 {
     Bytes16 m{};
     for (int j = 0; j < 16; ++j) {
         const int b = base + j;
-        m[j] = (b % Bpp == slot) ? at + b / Bpp : -1;
+        m.b[j] = static_cast<int8_t>((b % Bpp == slot) ? at + b / Bpp : -1);
     }
     return m;
 }
+
+template <int First, int Stride, int Base>
+inline constexpr Bytes16 kGather = gatherMask(First, Stride, Base);
+template <int Bpp, int Base, int Slot, int At>
+inline constexpr Bytes16 kScatter = scatterMask(Bpp, Base, Slot, At);
 
 template <class L>
 struct Io;
 
 template <int Bpp, Order O>
 struct Io<InPacked<Bpp, O>> {
+    template <int Byte>
+    static V gather(V lo, V hi)
+    {
+        return _mm_or_si128(_mm_shuffle_epi8(lo, maskOf(kGather<Byte, Bpp, 0>)),
+                            _mm_shuffle_epi8(hi, maskOf(kGather<Byte, Bpp, 16>)));
+    }
     static V3 get8(const typename InPacked<Bpp, O>::Row& row, int x)
     {
         const uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * Bpp;
         const V lo = load16(q);
         const V hi = Bpp == 4 ? load16(q + 16) : load8(q + 16);
         V3 v;
-        for (int k = 0; k < 3; ++k) {
-            const int o = channelByte(O, k);
-            v.c[k] = _mm_or_si128(_mm_shuffle_epi8(lo, maskOf(gatherMask(o, Bpp, 0))),
-                                  _mm_shuffle_epi8(hi, maskOf(gatherMask(o, Bpp, 16))));
-        }
-        if constexpr (Bpp == 4)
-            v.extra = _mm_or_si128(_mm_shuffle_epi8(lo, maskOf(gatherMask(3, 4, 0))),
-                                   _mm_shuffle_epi8(hi, maskOf(gatherMask(3, 4, 16))));
-        else
-            v.extra = _mm_setzero_si128();
+        v.c[0] = gather<channelByte(O, 0)>(lo, hi);
+        v.c[1] = gather<channelByte(O, 1)>(lo, hi);
+        v.c[2] = gather<channelByte(O, 2)>(lo, hi);
+        v.extra = Bpp == 4 ? gather<3>(lo, hi) : _mm_setzero_si128();
         return v;
     }
 };
@@ -107,22 +111,19 @@ struct Io<OutPacked<Bpp, O, F>> {
         else if constexpr (F == Fourth::Zero)
             fourth = _mm_setzero_si128();
         const V b = packUs(v.c[2], fourth);
-        auto part = [&](int base) {
-            V r = _mm_setzero_si128();
-            for (int k = 0; k < 3; ++k) {
-                const int slot = channelByte(O, k);
-                const V src = k < 2 ? a : b;
-                r = _mm_or_si128(r, _mm_shuffle_epi8(src, maskOf(scatterMask(Bpp, base, slot, k < 2 ? 8 * k : 0))));
-            }
+        auto part = [&]<int Base>() {
+            V r = _mm_or_si128(_mm_shuffle_epi8(a, maskOf(kScatter<Bpp, Base, channelByte(O, 0), 0>)),
+                               _mm_shuffle_epi8(a, maskOf(kScatter<Bpp, Base, channelByte(O, 1), 8>)));
+            r = _mm_or_si128(r, _mm_shuffle_epi8(b, maskOf(kScatter<Bpp, Base, channelByte(O, 2), 0>)));
             if constexpr (Bpp == 4)
-                r = _mm_or_si128(r, _mm_shuffle_epi8(b, maskOf(scatterMask(4, base, 3, 8))));
+                r = _mm_or_si128(r, _mm_shuffle_epi8(b, maskOf(kScatter<4, Base, 3, 8>)));
             return r;
         };
-        store16(q, part(0));
+        store16(q, part.template operator()<0>());
         if constexpr (Bpp == 4)
-            store16(q + 16, part(16));
+            store16(q + 16, part.template operator()<16>());
         else
-            store8(q + 16, part(16));
+            store8(q + 16, part.template operator()<16>());
     }
 };
 
