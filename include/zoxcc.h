@@ -122,6 +122,30 @@ ZOXCC_API zoxStatus zoxiYUVToRGB_8u_C3C4R(const uint8_t* src, int srcStep, uint8
 ZOXCC_API zoxStatus zoxiYUVToRGB_8u_P3C3R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
 ZOXCC_API zoxStatus zoxiYUVToRGB_8u_P3R(const uint8_t* const src[3], int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
 
+/* ---- RGB <-> YCbCr, 8u, full resolution --------------------------------------------------------------
+ * Studio range: Y 16..235, Cb and Cr 16..240 around 128; BT.601 weights, BT.709 in the 709CSC forms.
+ * C3: R,G,B (forward source) or Y,Cb,Cr (inverse source), lowest address first; YCbCrToBGR writes
+ * B,G,R. AC4R: the destination's fourth byte is neither read nor written. AC4P3R: the source's fourth
+ * byte is not used. P3C4R: alpha fills the fourth byte. Block widths N: RGBToYCbCr C3R 16, C3P3R 16,
+ * AC4P3R 8, P3R 8; YCbCrToRGB C3R 4, P3R 4, P3C3R 8, P3C4R 8; the AC4R forms and the four YCbCrToBGR
+ * forms use one form in all columns. Checks: C3R and AC4R forms: src/dst null, then sizes. RGBToYCbCr
+ * C3P3R and AC4P3R and the YCbCrToBGR forms: src/dst and each plane pointer, then sizes. The other P3
+ * forms: src/dst null, then sizes, then each plane pointer. Steps are not examined. */
+ZOXCC_API zoxStatus zoxiRGBToYCbCr_8u_C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCbCr_8u_AC4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCbCr_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCbCr_8u_AC4P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCbCr_8u_P3R(const uint8_t* const src[3], int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB_8u_C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB_8u_AC4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB_8u_P3R(const uint8_t* const src[3], int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB_8u_P3C3R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB_8u_P3C4R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR_8u_P3C3R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR_8u_P3C4R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR_709CSC_8u_P3C3R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR_709CSC_8u_P3C4R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+
 #ifdef __cplusplus
 }
 #endif

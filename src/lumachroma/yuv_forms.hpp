@@ -1,4 +1,4 @@
-// RGB <-> YUV at full resolution: the coefficient sets and the per-pixel forms.
+// RGB <-> YUV at full resolution: the per-pixel forms over the Yuv coefficient sets.
 //
 // Y = 0.299 R + 0.587 G + 0.114 B at full range, U = 0.492 (B - Y) + 128, V = 0.877 (R - Y) + 128.
 // Every form is one pixel in, one pixel out; the block forms are the arithmetic of the 16-bit lane
@@ -7,37 +7,9 @@
 
 #include "frame/layouts.hpp"
 #include "frame/ops.hpp"
+#include "lumachroma/coefficients.hpp"
 
 namespace zox {
-
-// ---- coefficient sets -------------------------------------------------------------------------------
-
-// Y in 1/65536 (unsigned gains on 256 x sample), U and V in 1/32768 (signed gains on 128 x sample).
-struct YuvMatrixForward {
-    static constexpr int yR = 19595, yG = 38469, yB = 7471;
-    static constexpr int uR = -4816, uG = -9469, uB = 14286;
-    static constexpr int vR = 20152, vG = -16875, vB = -3276;
-};
-// The three luma weights sum to 65536 (38470 for green); chroma gains act on B - Y and R - Y.
-struct YuvDifferenceForward {
-    static constexpr int yR = 19595, yG = 38470, yB = 7471;
-    static constexpr int uGain = 32244, vGain = 57475;
-};
-// All in 1/32768; chroma gains act on 2B - 2Y and 2R - 2Y.
-struct YuvHalfForward {
-    static constexpr int yR = 9798, yG = 19235, yB = 3736;
-    static constexpr int uGain = 16121, vGain = 28737;
-};
-
-// Gains of (U - 128) and (V - 128) for the inverse direction.
-struct YuvInverseGains {
-    int vR, uG, vG, uB;
-};
-inline constexpr YuvInverseGains YuvInverseRounded{74711, -25821, -38076, 133169};   // 1/65536
-inline constexpr YuvInverseGains YuvInverseTruncated{74710, -25820, -38075, 133168}; // 1/65536
-inline constexpr YuvInverseGains YuvInverseBlock8{9339, -3228, -4760, 16646};        // 1/8192
-inline constexpr YuvInverseGains YuvInverseBlock16{9338, -3227, -4759, 16645};       // 1/8192
-inline constexpr YuvInverseGains YuvInverseBlock128{4669, -1614, -2380, 8323};       // 1/4096
 
 // ---- forward forms ----------------------------------------------------------------------------------
 
