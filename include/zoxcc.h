@@ -146,6 +146,51 @@ ZOXCC_API zoxStatus zoxiYCbCrToBGR_8u_P3C4R(const uint8_t* const src[3], int src
 ZOXCC_API zoxStatus zoxiYCbCrToBGR_709CSC_8u_P3C3R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
 ZOXCC_API zoxStatus zoxiYCbCrToBGR_709CSC_8u_P3C4R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
 
+/* ---- Gamma correction, 8u / 16u / 32f ----------------------------------------------------------------
+ * The BT.709 transfer curve, forward (linear to encoded) or inverse, on every colour sample. 8u reads a
+ * constant table; 16u evaluates the curve in double precision per sample, or through a 65536-entry table
+ * taken from zoxcore for the call when the region has more than 65536 colour samples
+ * (zoxStatusNoMemory, image untouched, when that fails); 32f maps through [rangeLow, rangeHigh] without
+ * clamping. AC4: the fourth channel is neither read nor written. I: in place. P3: three planes, one step.
+ * Checks: 32f range (zoxStatusBadRange when rangeHigh - rangeLow is not above 0), pointers (source side
+ * first, the plane array then each plane), sizes, steps below 1 (zoxStatusBadStep). */
+ZOXCC_API zoxStatus zoxiGammaFwd_8u_C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaFwd_8u_C3IR(uint8_t* srcDst, int srcDstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaFwd_8u_AC4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaFwd_8u_AC4IR(uint8_t* srcDst, int srcDstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaFwd_8u_P3R(const uint8_t* const src[3], int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaFwd_8u_IP3R(uint8_t* const srcDst[3], int srcDstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaFwd_16u_C3R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaFwd_16u_C3IR(uint16_t* srcDst, int srcDstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaFwd_16u_AC4R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaFwd_16u_AC4IR(uint16_t* srcDst, int srcDstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaFwd_16u_P3R(const uint16_t* const src[3], int srcStep, uint16_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaFwd_16u_IP3R(uint16_t* const srcDst[3], int srcDstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaFwd_32f_C3R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
+ZOXCC_API zoxStatus zoxiGammaFwd_32f_C3IR(float* srcDst, int srcDstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
+ZOXCC_API zoxStatus zoxiGammaFwd_32f_AC4R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
+ZOXCC_API zoxStatus zoxiGammaFwd_32f_AC4IR(float* srcDst, int srcDstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
+ZOXCC_API zoxStatus zoxiGammaFwd_32f_P3R(const float* const src[3], int srcStep, float* const dst[3], int dstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
+ZOXCC_API zoxStatus zoxiGammaFwd_32f_IP3R(float* const srcDst[3], int srcDstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
+ZOXCC_API zoxStatus zoxiGammaInv_8u_C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaInv_8u_C3IR(uint8_t* srcDst, int srcDstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaInv_8u_AC4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaInv_8u_AC4IR(uint8_t* srcDst, int srcDstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaInv_8u_P3R(const uint8_t* const src[3], int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaInv_8u_IP3R(uint8_t* const srcDst[3], int srcDstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaInv_16u_C3R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaInv_16u_C3IR(uint16_t* srcDst, int srcDstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaInv_16u_AC4R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaInv_16u_AC4IR(uint16_t* srcDst, int srcDstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaInv_16u_P3R(const uint16_t* const src[3], int srcStep, uint16_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaInv_16u_IP3R(uint16_t* const srcDst[3], int srcDstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGammaInv_32f_C3R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
+ZOXCC_API zoxStatus zoxiGammaInv_32f_C3IR(float* srcDst, int srcDstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
+ZOXCC_API zoxStatus zoxiGammaInv_32f_AC4R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
+ZOXCC_API zoxStatus zoxiGammaInv_32f_AC4IR(float* srcDst, int srcDstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
+ZOXCC_API zoxStatus zoxiGammaInv_32f_P3R(const float* const src[3], int srcStep, float* const dst[3], int dstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
+ZOXCC_API zoxStatus zoxiGammaInv_32f_IP3R(float* const srcDst[3], int srcDstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
+
 #ifdef __cplusplus
 }
 #endif
