@@ -2,10 +2,12 @@
 namespace zb {
 void registerConvFamilies();
 void registerPeers();
+void registerGammaFamily();
 
 void registerAll()
 {
     registerConvFamilies();
+    registerGammaFamily();
     registerPeers();
 }
 } // namespace zb
