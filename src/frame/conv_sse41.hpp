@@ -16,9 +16,21 @@ struct V3 {
     V extra;
 };
 
-// A family's block form over eight lanes, in place; results leave in 16-bit lanes before clip8.
+// A family's block form over eight lanes, in place; results leave in 16-bit lanes before clip8. A form
+// that wants its samples at 256 x declares `static constexpr int inputShift = 8`.
 template <class Form>
 struct Simd;
+
+template <class Form>
+constexpr int inputShiftOf()
+{
+    if constexpr (requires { Simd<Form>::inputShift; })
+        return Simd<Form>::inputShift;
+    else
+        return 0;
+}
+template <class Form>
+inline constexpr int inputShift = inputShiftOf<Form>();
 
 // Sixteen shuffle-control bytes as constant data (-1: a zero byte).
 struct alignas(16) Bytes16 {
@@ -31,14 +43,15 @@ inline V maskOf(const Bytes16& m)
 }
 
 // Gather mask that takes, for lane i, the byte at `first + stride * i - base` of a 16-byte register,
-// when it lies inside it, into the lane's low byte.
-constexpr Bytes16 gatherMask(int first, int stride, int base)
+// when it lies inside it, into the lane's low byte (shift 0: the value) or high byte (shift 8: 256 x).
+constexpr Bytes16 gatherMask(int first, int stride, int base, int shift)
 {
     Bytes16 m{};
     for (int i = 0; i < 8; ++i) {
         const int b = first + stride * i - base;
-        m.b[2 * i] = static_cast<int8_t>((b >= 0 && b < 16) ? b : -1);
-        m.b[2 * i + 1] = -1;
+        const int8_t pick = static_cast<int8_t>((b >= 0 && b < 16) ? b : -1);
+        m.b[2 * i] = shift == 0 ? pick : int8_t{-1};
+        m.b[2 * i + 1] = shift == 0 ? int8_t{-1} : pick;
     }
     return m;
 }
@@ -55,45 +68,90 @@ constexpr Bytes16 scatterMask(int Bpp, int base, int slot, int at)
     return m;
 }
 
-template <int First, int Stride, int Base>
-inline constexpr Bytes16 kGather = gatherMask(First, Stride, Base);
+template <int First, int Stride, int Base, int Shift>
+inline constexpr Bytes16 kGather = gatherMask(First, Stride, Base, Shift);
 template <int Bpp, int Base, int Slot, int At>
 inline constexpr Bytes16 kScatter = scatterMask(Bpp, Base, Slot, At);
 
 template <class L>
 struct Io;
 
+// Readers take eight or sixteen pixels; Shift 8 places each sample in the upper byte of its lane
+// (256 x), Shift 0 in the lower. The carried fourth byte always sits in the lower byte.
 template <int Bpp, Order O>
 struct Io<InPacked<Bpp, O>> {
-    template <int Byte>
+    // Lanes of the pixels whose bytes start at `first` of the pair of registers (lo at base, hi at base + 16).
+    template <int First, int Base, int Shift>
     static V gather(V lo, V hi)
     {
-        return _mm_or_si128(_mm_shuffle_epi8(lo, maskOf(kGather<Byte, Bpp, 0>)),
-                            _mm_shuffle_epi8(hi, maskOf(kGather<Byte, Bpp, 16>)));
+        return _mm_or_si128(_mm_shuffle_epi8(lo, maskOf(kGather<First, Bpp, Base, Shift>)),
+                            _mm_shuffle_epi8(hi, maskOf(kGather<First, Bpp, Base + 16, Shift>)));
     }
+    template <int Start, int Base, int Shift>
+    static V3 split(V lo, V hi)
+    {
+        V3 v;
+        v.c[0] = gather<Start + channelByte(O, 0), Base, Shift>(lo, hi);
+        v.c[1] = gather<Start + channelByte(O, 1), Base, Shift>(lo, hi);
+        v.c[2] = gather<Start + channelByte(O, 2), Base, Shift>(lo, hi);
+        v.extra = Bpp == 4 ? gather<Start + 3, Base, 0>(lo, hi) : _mm_setzero_si128();
+        return v;
+    }
+    template <int Shift>
     static V3 get8(const typename InPacked<Bpp, O>::Row& row, int x)
     {
         const uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * Bpp;
-        const V lo = load16(q);
-        const V hi = Bpp == 4 ? load16(q + 16) : load8(q + 16);
-        V3 v;
-        v.c[0] = gather<channelByte(O, 0)>(lo, hi);
-        v.c[1] = gather<channelByte(O, 1)>(lo, hi);
-        v.c[2] = gather<channelByte(O, 2)>(lo, hi);
-        v.extra = Bpp == 4 ? gather<3>(lo, hi) : _mm_setzero_si128();
-        return v;
+        return split<0, 0, Shift>(load16(q), Bpp == 4 ? load16(q + 16) : load8(q + 16));
+    }
+    template <int Shift>
+    static void get16(const typename InPacked<Bpp, O>::Row& row, int x, V3& a, V3& b)
+    {
+        const uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * Bpp;
+        const V r0 = load16(q), r1 = load16(q + 16), r2 = load16(q + 32);
+        a = split<0, 0, Shift>(r0, r1);
+        if constexpr (Bpp == 3)
+            b = split<24, 16, Shift>(r1, r2); // pixels 8..15: bytes 24..47
+        else
+            b = split<32, 32, Shift>(r2, load16(q + 48));
     }
 };
 
 template <int P>
 struct Io<InPlanar<P>> {
+    template <int Shift>
+    static V widenLo(V x)
+    {
+        return Shift == 0 ? _mm_cvtepu8_epi16(x) : _mm_unpacklo_epi8(_mm_setzero_si128(), x);
+    }
+    template <int Shift>
+    static V widenHi(V x)
+    {
+        return Shift == 0 ? _mm_unpackhi_epi8(x, _mm_setzero_si128()) : _mm_unpackhi_epi8(_mm_setzero_si128(), x);
+    }
+    template <int Shift>
     static V3 get8(const typename InPlanar<P>::Row& row, int x)
     {
         V3 v;
         for (int k = 0; k < 3; ++k)
-            v.c[k] = _mm_cvtepu8_epi16(load8(row.p[k] + x));
-        v.extra = P == 4 ? _mm_cvtepu8_epi16(load8(row.p[3] + x)) : _mm_setzero_si128();
+            v.c[k] = widenLo<Shift>(load8(row.p[k] + x));
+        v.extra = P == 4 ? widenLo<0>(load8(row.p[3] + x)) : _mm_setzero_si128();
         return v;
+    }
+    template <int Shift>
+    static void get16(const typename InPlanar<P>::Row& row, int x, V3& a, V3& b)
+    {
+        for (int k = 0; k < 3; ++k) {
+            const V r = load16(row.p[k] + x);
+            a.c[k] = widenLo<Shift>(r);
+            b.c[k] = widenHi<Shift>(r);
+        }
+        if constexpr (P == 4) {
+            const V r = load16(row.p[3] + x);
+            a.extra = widenLo<0>(r);
+            b.extra = widenHi<0>(r);
+        } else {
+            a.extra = b.extra = _mm_setzero_si128();
+        }
     }
 };
 
@@ -125,6 +183,41 @@ struct Io<OutPacked<Bpp, O, F>> {
         else
             store8(q + 16, part.template operator()<16>());
     }
+    static V fourthOf(const V3& v, const Ctx& ctx)
+    {
+        if constexpr (F == Fourth::Alpha)
+            return splat16(ctx.alpha);
+        else if constexpr (F == Fourth::Zero)
+            return _mm_setzero_si128();
+        else
+            return v.extra;
+    }
+    // Sixteen pixels: each channel packed once to sixteen bytes, then interleaved.
+    static void put16(const typename OutPacked<Bpp, O, F>::Row& row, int x, const V3& a, const V3& b, const Ctx& ctx)
+    {
+        uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * Bpp;
+        V ch[3];
+        for (int k = 0; k < 3; ++k)
+            ch[k] = packUs(a.c[channelByte(O, k)], b.c[channelByte(O, k)]); // ch[slot]: bytes of slot `slot`
+        if constexpr (Bpp == 3) {
+            auto part = [&]<int Base>() {
+                return _mm_or_si128(_mm_or_si128(_mm_shuffle_epi8(ch[0], maskOf(kScatter<3, Base, 0, 0>)),
+                                                 _mm_shuffle_epi8(ch[1], maskOf(kScatter<3, Base, 1, 0>))),
+                                    _mm_shuffle_epi8(ch[2], maskOf(kScatter<3, Base, 2, 0>)));
+            };
+            store16(q, part.template operator()<0>());
+            store16(q + 16, part.template operator()<16>());
+            store16(q + 32, part.template operator()<32>());
+        } else {
+            const V c3 = packUs(fourthOf(a, ctx), fourthOf(b, ctx));
+            const V lo01 = _mm_unpacklo_epi8(ch[0], ch[1]), hi01 = _mm_unpackhi_epi8(ch[0], ch[1]);
+            const V lo23 = _mm_unpacklo_epi8(ch[2], c3), hi23 = _mm_unpackhi_epi8(ch[2], c3);
+            store16(q, _mm_unpacklo_epi16(lo01, lo23));
+            store16(q + 16, _mm_unpackhi_epi16(lo01, lo23));
+            store16(q + 32, _mm_unpacklo_epi16(hi01, hi23));
+            store16(q + 48, _mm_unpackhi_epi16(hi01, hi23));
+        }
+    }
 };
 
 template <int P>
@@ -135,6 +228,13 @@ struct Io<OutPlanar<P>> {
             sse41::store8(row.p[k] + x, packUs(v.c[k], v.c[k]));
         if constexpr (P == 4)
             sse41::store8(row.p[3] + x, packUs(v.extra, v.extra));
+    }
+    static void put16(const typename OutPlanar<P>::Row& row, int x, const V3& a, const V3& b, const Ctx&)
+    {
+        for (int k = 0; k < 3; ++k)
+            store16(row.p[k] + x, packUs(a.c[k], b.c[k]));
+        if constexpr (P == 4)
+            store16(row.p[3] + x, packUs(a.extra, b.extra));
     }
 };
 
@@ -156,7 +256,7 @@ void stagedGroup(const typename C::Src::Row& s, const typename C::Dst::Row& d, i
     }
     for (int p = 0; p < Dst::planes; ++p)
         ld.p[p] = out[p];
-    V3 v = Io<Src>::get8(ls, 0);
+    V3 v = Io<Src>::template get8<inputShift<typename C::Block>>(ls, 0);
     Simd<typename C::Block>::apply(v);
     Io<Dst>::put8(ld, 0, v, ctx);
     for (int p = 0; p < Dst::planes; ++p)
@@ -168,11 +268,23 @@ template <class C>
 void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx)
 {
     if constexpr (C::N > 1) {
+        using In = Io<typename C::Src>;
+        using Out = Io<typename C::Dst>;
+        using F = Simd<typename C::Block>;
+        constexpr int shift = inputShift<typename C::Block>;
         int x = 0;
-        for (; x + 8 <= n; x += 8) {
-            V3 v = Io<typename C::Src>::get8(s, x);
-            Simd<typename C::Block>::apply(v);
-            Io<typename C::Dst>::put8(d, x, v, ctx);
+        for (; x + 16 <= n; x += 16) {
+            V3 a, b;
+            In::template get16<shift>(s, x, a, b);
+            F::apply(a);
+            F::apply(b);
+            Out::put16(d, x, a, b, ctx);
+        }
+        if (x + 8 <= n) {
+            V3 v = In::template get8<shift>(s, x);
+            F::apply(v);
+            Out::put8(d, x, v, ctx);
+            x += 8;
         }
         if (x < n)
             stagedGroup<C>(s, d, x, n - x, ctx);

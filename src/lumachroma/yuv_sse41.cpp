@@ -8,9 +8,10 @@ namespace zox::sse41 {
 template <>
 struct Simd<YuvFromRgbMatrix> {
     using K = YuvMatrixForward;
+    static constexpr int inputShift = 8; // samples arrive at 256 x
     static void apply(V3& v)
     {
-        const V r8 = shl<8>(v.c[0]), g8 = shl<8>(v.c[1]), b8 = shl<8>(v.c[2]);
+        const V r8 = v.c[0], g8 = v.c[1], b8 = v.c[2];
         const V r7 = shrU<1>(r8), g7 = shrU<1>(g8), b7 = shrU<1>(b8);
         // The luma sum stays below 65536, so plain 16-bit adds hold it.
         const V y = shrU<8>(add(add(mulHighU(r8, splat16(K::yR)), mulHighU(g8, splat16(K::yG))), mulHighU(b8, splat16(K::yB))));
