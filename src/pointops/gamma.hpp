@@ -56,6 +56,8 @@ struct GammaMap<uint8_t, D> {
     const uint8_t* table = D == gamma::Dir::Fwd ? gamma::kGammaFwd8u : gamma::kGammaInv8u;
     zoxStatus prepare(long long, GammaRange) { return zoxStatusOk; }
     uint8_t operator()(uint8_t s) const { return table[s]; }
+    template <class Walk>
+    void run(Walk&& walk) const { walk(*this); }
     void release() {}
 };
 
@@ -75,7 +77,15 @@ struct GammaMap<uint16_t, D> {
             table[s] = gamma::eval16u<D>(static_cast<uint16_t>(s));
         return zoxStatusOk;
     }
-    uint16_t operator()(uint16_t s) const { return table ? table[s] : gamma::eval16u<D>(s); }
+    // The walk runs with the one mapping this call chose, so that no sample asks again.
+    template <class Walk>
+    void run(Walk&& walk) const
+    {
+        if (table)
+            walk([t = table](uint16_t s) { return t[s]; });
+        else
+            walk([](uint16_t s) { return gamma::eval16u<D>(s); });
+    }
     void release() { freeUnits(table); }
 };
 
@@ -92,8 +102,19 @@ struct GammaMap<float, D> {
         return zoxStatusOk;
     }
     float operator()(float s) const { return gamma::eval32f<D>(s, low, r32, r, q); }
+    template <class Walk>
+    void run(Walk&& walk) const { walk(*this); }
     void release() {}
 };
+
+// A run of n contiguous samples, source and destination possibly the same.
+template <class Map, class T>
+void mapSamples(const Map& map, const T* s, T* d, std::size_t n)
+{
+#pragma GCC unroll 8
+    for (std::size_t i = 0; i < n; ++i)
+        d[i] = map(s[i]);
+}
 
 // Stand-in for a null plane array, so that the walk can index it; the null itself is reported first.
 template <class T>
@@ -131,16 +152,21 @@ zoxStatus gammaRun(const T* const* src, bool srcArrayNull, int srcStep, T* const
     GammaMap<T, D> map;
     if (const zoxStatus st = map.prepare(n, range); st != zoxStatusOk)
         return st;
-    for (int p = 0; p < L::planes; ++p)
-        for (int r = 0; r < roi.height; ++r) {
-            const T* s = rowAddress(src[p], srcStep, r);
-            T* d = rowAddress(dst[p], dstStep, r);
-            for (int x = 0; x < roi.width; ++x) {
-                const std::size_t at = static_cast<std::size_t>(x) * L::stride;
-                for (int c = 0; c < L::colours; ++c)
-                    d[at + c] = map(s[at + c]);
+    map.run([&](const auto& f) {
+        for (int p = 0; p < L::planes; ++p)
+            for (int r = 0; r < roi.height; ++r) {
+                const T* s = rowAddress(src[p], srcStep, r);
+                T* d = rowAddress(dst[p], dstStep, r);
+                if constexpr (L::stride == L::colours)
+                    mapSamples(f, s, d, static_cast<std::size_t>(roi.width) * L::colours);
+                else
+                    for (int x = 0; x < roi.width; ++x) {
+                        const std::size_t at = static_cast<std::size_t>(x) * L::stride;
+                        for (int c = 0; c < L::colours; ++c)
+                            d[at + c] = f(s[at + c]);
+                    }
             }
-        }
+    });
     map.release();
     return zoxStatusOk;
 }
