@@ -2,6 +2,7 @@
 // generic harness checks every export against its table forms; these check that the table names the
 // right forms.
 #include "lumachroma/ycbcr_forms.hpp"
+#include "support/conv_sweep.hpp"
 #include "zoxcc.h"
 
 #include <gtest/gtest.h>
@@ -10,8 +11,6 @@
 #include <cstdlib>
 #include <functional>
 #include <string>
-#include <type_traits>
-#include <vector>
 
 using namespace zox;
 
@@ -28,54 +27,10 @@ Triple run(Form f, Triple in)
     return {p.c[0], p.c[1], p.c[2]};
 }
 
-// The pixel `in` at column x of a one-row image of width w, all other pixels zero. `in` goes to the
-// source in channel order (bytes 0..2, or planes 0..2); the result is read back as the destination's
-// bytes 0..2 (or planes 0..2), so a BGR destination reads back reversed.
-template <class Src, class Dst, class F>
-Triple atColumn(F f, Triple in, int x, int w)
-{
-    std::vector<std::vector<uint8_t>> s(Src::planes, std::vector<uint8_t>(w * Src::bytesPerPixel, 0));
-    std::vector<std::vector<uint8_t>> d(Dst::planes, std::vector<uint8_t>(w * Dst::bytesPerPixel, 0));
-    for (int k = 0; k < 3; ++k) {
-        if constexpr (Src::planes == 1)
-            s[0][x * Src::bytesPerPixel + k] = static_cast<uint8_t>(in[k]);
-        else
-            s[k][x] = static_cast<uint8_t>(in[k]);
-    }
-    const uint8_t* sp[3];
-    uint8_t* dp[3];
-    for (int p = 0; p < Src::planes; ++p)
-        sp[p] = s[p].data();
-    for (int p = 0; p < Dst::planes; ++p)
-        dp[p] = d[p].data();
-    typename Src::Arg sa;
-    typename Dst::Arg da;
-    if constexpr (Src::planes == 1)
-        sa = sp[0];
-    else
-        sa = sp;
-    if constexpr (Dst::planes == 1)
-        da = dp[0];
-    else
-        da = dp;
-    const ImageSize roi{w, 1};
-    const int ss = w * Src::bytesPerPixel, ds = w * Dst::bytesPerPixel;
-    zoxStatus st;
-    if constexpr (std::is_invocable_v<F, typename Src::Arg, int, typename Dst::Arg, int, ImageSize, uint8_t>)
-        st = f(sa, ss, da, ds, roi, 0);
-    else
-        st = f(sa, ss, da, ds, roi);
-    EXPECT_EQ(st, zoxStatusOk);
-    if constexpr (Dst::planes == 1)
-        return {d[0][x * Dst::bytesPerPixel], d[0][x * Dst::bytesPerPixel + 1], d[0][x * Dst::bytesPerPixel + 2]};
-    else
-        return {d[0][x], d[1][x], d[2][x]};
-}
-
 template <class Src, class Dst, class F>
 Export through(F f)
 {
-    return [f](Triple in, int x, int w) { return atColumn<Src, Dst>(f, in, x, w); };
+    return [f](Triple in, int x, int w) { return zt::pixelAt<Src, Dst>(f, in, x, w); };
 }
 
 struct ExportRow {

@@ -1,11 +1,11 @@
 // Values that pin the roundings and column rules of RGB <-> YUV.
 #include "lumachroma/yuv_forms.hpp"
+#include "support/conv_sweep.hpp"
 #include "zoxcc.h"
 
 #include <gtest/gtest.h>
 
 #include <array>
-#include <vector>
 
 using namespace zox;
 
@@ -20,15 +20,13 @@ Triple run(Triple in)
     return {p.c[0], p.c[1], p.c[2]};
 }
 
-// The pixel `in` at column `x` of a one-row C3 image of width `w`, all other pixels black.
-template <class F>
-Triple atColumn(F f, Triple in, int x, int w)
+Triple rgbToYuv(Triple in, int x, int w)
 {
-    std::vector<uint8_t> src(3 * w, 0), dst(3 * w, 0);
-    for (int k = 0; k < 3; ++k)
-        src[3 * x + k] = static_cast<uint8_t>(in[k]);
-    EXPECT_EQ(f(src.data(), 3 * w, dst.data(), 3 * w, ImageSize{w, 1}), zoxStatusOk);
-    return {dst[3 * x], dst[3 * x + 1], dst[3 * x + 2]};
+    return zt::pixelAt<InC3, OutC3>(zoxiRGBToYUV_8u_C3R, in, x, w);
+}
+Triple yuvToRgb(Triple in, int x, int w)
+{
+    return zt::pixelAt<InC3, OutC3>(zoxiYUVToRGB_8u_C3R, in, x, w);
 }
 
 } // namespace
@@ -60,13 +58,13 @@ TEST(YuvExports, ColumnDecidesTheForm)
     ASSERT_EQ(zoxiRGBToYUV_8u_AC4R(ac4, 4, out, 4, ImageSize{1, 1}), zoxStatusOk);
     EXPECT_EQ(out[0], 150);
     EXPECT_EQ(out[3], 91);
-    EXPECT_EQ(atColumn(zoxiRGBToYUV_8u_C3R, {0, 255, 0}, 0, 1)[0], 149);
+    EXPECT_EQ(rgbToYuv( {0, 255, 0}, 0, 1)[0], 149);
     // White: block column 254,127,127; remainder column 255,128,128 (width 17: column 16 is behind the block).
-    EXPECT_EQ(atColumn(zoxiRGBToYUV_8u_C3R, {255, 255, 255}, 15, 17), (Triple{254, 127, 127}));
-    EXPECT_EQ(atColumn(zoxiRGBToYUV_8u_C3R, {255, 255, 255}, 16, 17), (Triple{255, 128, 128}));
+    EXPECT_EQ(rgbToYuv( {255, 255, 255}, 15, 17), (Triple{254, 127, 127}));
+    EXPECT_EQ(rgbToYuv( {255, 255, 255}, 16, 17), (Triple{255, 128, 128}));
     // (128, 255, 255) back to RGB: green 3 in a block, 4 at a remainder column.
-    EXPECT_EQ(atColumn(zoxiYUVToRGB_8u_C3R, {128, 255, 255}, 0, 8)[1], 3);
-    EXPECT_EQ(atColumn(zoxiYUVToRGB_8u_C3R, {128, 255, 255}, 0, 7)[1], 4);
+    EXPECT_EQ(yuvToRgb( {128, 255, 255}, 0, 8)[1], 3);
+    EXPECT_EQ(yuvToRgb( {128, 255, 255}, 0, 7)[1], 4);
 }
 
 TEST(YuvForms, GrayStaysGrayInEveryInverseForm)

@@ -32,7 +32,7 @@ T expected(T s, GammaRange range)
 template <class T>
 void fillSamples(zt::Plane& p, zt::Rng& rng)
 {
-    const auto& s = p.spec();
+    const auto& s = p.shape();
     for (int r = 0; r < s.rows; ++r) {
         auto* row = reinterpret_cast<T*>(p.row(r));
         for (std::size_t i = 0; i < s.rowBytes / sizeof(T); ++i) {
@@ -85,10 +85,10 @@ void sweep(const char* name, F f)
             std::vector<std::unique_ptr<zt::Plane>> srcP, dstP;
             std::vector<T*> src, dst;
             for (int p = 0; p < L::planes; ++p) {
-                srcP.push_back(std::make_unique<zt::Plane>(zt::PlaneSpec{h, rowBytes, rowBytes + 4, (w + p) % 17 - 1}, rng));
+                srcP.push_back(std::make_unique<zt::Plane>(zt::PlaneShape{h, rowBytes, rowBytes + 4, (w + p) % 17 - 1}, rng));
                 fillSamples<T>(*srcP.back(), rng);
                 src.push_back(reinterpret_cast<T*>(srcP.back()->data()));
-                dstP.push_back(std::make_unique<zt::Plane>(zt::PlaneSpec{h, rowBytes, rowBytes + 8, (w * 3 + p) % 16}, rng));
+                dstP.push_back(std::make_unique<zt::Plane>(zt::PlaneShape{h, rowBytes, rowBytes + 8, (w * 3 + p) % 16}, rng));
                 dst.push_back(reinterpret_cast<T*>(dstP.back()->data()));
             }
             std::vector<std::vector<uint8_t>> srcBefore, dstBefore;
@@ -99,12 +99,12 @@ void sweep(const char* name, F f)
             const bool ip = inPlace<F, T>;
             auto& outP = ip ? srcP : dstP;
             auto& outBefore = ip ? srcBefore : dstBefore;
-            ASSERT_EQ(call<T>(f, src, srcP[0]->spec().step, dst, dstP[0]->spec().step, ImageSize{w, h}, range), zoxStatusOk);
+            ASSERT_EQ(call<T>(f, src, srcP[0]->shape().step, dst, dstP[0]->shape().step, ImageSize{w, h}, range), zoxStatusOk);
             for (int p = 0; p < L::planes; ++p) {
                 if (!ip)
                     ASSERT_EQ(srcP[p]->bytes(), srcBefore[p]) << "source changed";
                 ASSERT_EQ(outP[p]->firstGuardChange(outBefore[p]), -1) << "written outside the region";
-                const auto& sp = srcP[p]->spec();
+                const auto& sp = srcP[p]->shape();
                 for (int r = 0; r < h; ++r) {
                     const uint8_t* before = outBefore[p].data() + (outP[p]->row(r) - outP[p]->blockBegin());
                     const uint8_t* inBytes = srcBefore[p].data() + (srcP[p]->row(r) - srcP[p]->blockBegin());
@@ -192,13 +192,4 @@ TEST(Gamma16u, FailedAllocationLeavesImageUntouched)
     EXPECT_EQ(zoxiGammaFwd_16u_C3IR(img.data(), 30000 * 6, ImageSize{30000, 1}), zoxStatusNoMemory);
     EXPECT_EQ(img, before);
     EXPECT_EQ(zt::core::freeCalls.load(), 0);
-}
-
-TEST(Gamma32f, OutsideTheRangeIsNoError)
-{
-    float px[3] = {-0.5f, 0.5f, 2.0f}, out[3];
-    ASSERT_EQ(zoxiGammaFwd_32f_C3R(px, 12, out, 12, ImageSize{1, 1}, 0.0f, 1.0f), zoxStatusOk);
-    EXPECT_LT(out[0], 0.0f);  // linear foot on a negative x
-    EXPECT_GT(out[2], 1.0f);  // power segment above the range
-    EXPECT_FLOAT_EQ(out[1], static_cast<float>(1.099 * std::pow(0.5, 0.45) - 0.099));
 }

@@ -7,6 +7,7 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
 #include <memory>
 #include <string>
 #include <type_traits>
@@ -26,7 +27,7 @@ struct Side {
         for (int p = 0; p < L::planes; ++p) {
             // Planes of one side share the step but not their alignment.
             const int m = misalign < 0 ? -1 : (misalign + 5 * p) % 16;
-            planes.push_back(std::make_unique<Plane>(PlaneSpec{rows, width * L::bytesPerPixel, step, m}, rng));
+            planes.push_back(std::make_unique<Plane>(PlaneShape{rows, width * L::bytesPerPixel, step, m}, rng));
             ptrs.push_back(planes.back()->data());
         }
     }
@@ -225,6 +226,30 @@ void putPx(const typename L::Row& row, int x, int c0, int c1, int c2, int extra)
         if constexpr (L::planes == 4)
             const_cast<uint8_t*>(row.p[3])[x] = static_cast<uint8_t>(extra);
     }
+}
+
+// The pixel `in` (channel order) at column x of a one-row image of width w, all other pixels zero,
+// through export f; returns the destination's bytes 0..2 of that pixel (planes 0..2 when planar), so a
+// BGR destination reads back reversed.
+template <class Src, class Dst, class F>
+std::array<int, 3> pixelAt(F f, std::array<int, 3> in, int x, int w)
+{
+    Rng rng(1);
+    Side<Src> src(1, w, w * Src::bytesPerPixel, 0, rng);
+    Side<Dst> dst(1, w, w * Dst::bytesPerPixel, 0, rng);
+    const auto row = Src::row(src.arg(), src.step, 0);
+    for (int i = 0; i < w; ++i)
+        putPx<Src>(row, i, 0, 0, 0, 0);
+    putPx<Src>(row, x, in[0], in[1], in[2], 0);
+    const ImageSize roi{w, 1};
+    if constexpr (std::is_invocable_v<F, typename Src::Arg, int, typename Dst::Arg, int, ImageSize, uint8_t>)
+        EXPECT_EQ(f(src.arg(), src.step, dst.arg(), dst.step, roi, uint8_t{0}), zoxStatusOk);
+    else
+        EXPECT_EQ(f(src.arg(), src.step, dst.arg(), dst.step, roi), zoxStatusOk);
+    std::array<int, 3> out;
+    for (int k = 0; k < 3; ++k)
+        out[k] = Dst::planes == 1 ? dst.planes[0]->data()[x * Dst::bytesPerPixel + k] : dst.planes[k]->data()[x];
+    return out;
 }
 
 #if defined(ZOX_ISA_SSE41)

@@ -38,14 +38,14 @@ PageBlock::~PageBlock()
 
 namespace {
 // Extent of the region relative to row 0: [lo, hi).
-void extent(const PlaneSpec& s, std::ptrdiff_t& lo, std::ptrdiff_t& hi)
+void extent(const PlaneShape& s, std::ptrdiff_t& lo, std::ptrdiff_t& hi)
 {
     const std::ptrdiff_t last = static_cast<std::ptrdiff_t>(s.rows - 1) * s.step;
     lo = std::min<std::ptrdiff_t>(0, last);
     hi = std::max<std::ptrdiff_t>(0, last) + s.rowBytes;
 }
 
-std::size_t blockBytes(const PlaneSpec& s, std::size_t& originOffset)
+std::size_t blockBytes(const PlaneShape& s, std::size_t& originOffset)
 {
     std::ptrdiff_t lo, hi;
     extent(s, lo, hi);
@@ -60,14 +60,14 @@ std::size_t blockBytes(const PlaneSpec& s, std::size_t& originOffset)
 }
 } // namespace
 
-Plane::Plane(const PlaneSpec& spec, Rng& rng)
-    : spec_(spec), block_([&] {
+Plane::Plane(const PlaneShape& shape, Rng& rng)
+    : shape_(shape), block_([&] {
           std::size_t o;
-          return blockBytes(spec, o);
+          return blockBytes(shape, o);
       }())
 {
     std::size_t o;
-    blockBytes(spec, o);
+    blockBytes(shape, o);
     origin_ = block_.begin() + o;
     std::uniform_int_distribution<int> byte(0, 255);
     for (uint8_t* p = block_.begin(); p != block_.end(); ++p)
@@ -77,9 +77,9 @@ Plane::Plane(const PlaneSpec& spec, Rng& rng)
 bool Plane::inRegion(std::size_t offset) const
 {
     const std::ptrdiff_t rel = static_cast<std::ptrdiff_t>(offset) - (origin_ - block_.begin());
-    for (int r = 0; r < spec_.rows; ++r) {
-        const std::ptrdiff_t start = static_cast<std::ptrdiff_t>(r) * spec_.step;
-        if (rel >= start && rel < start + spec_.rowBytes)
+    for (int r = 0; r < shape_.rows; ++r) {
+        const std::ptrdiff_t start = static_cast<std::ptrdiff_t>(r) * shape_.step;
+        if (rel >= start && rel < start + shape_.rowBytes)
             return true;
     }
     return false;

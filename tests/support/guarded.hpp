@@ -30,7 +30,7 @@ private:
     std::size_t size_ = 0;
 };
 
-struct PlaneSpec {
+struct PlaneShape {
     int rows = 1;
     int rowBytes = 1; // region bytes of one row
     int step = 1;     // any sign; |step| >= rowBytes unless 0
@@ -40,10 +40,10 @@ struct PlaneSpec {
 // One plane of a test image.
 class Plane {
 public:
-    Plane(const PlaneSpec& spec, Rng& rng);
-    uint8_t* row(int r) const { return origin_ + static_cast<std::ptrdiff_t>(r) * spec_.step; }
+    Plane(const PlaneShape& shape, Rng& rng);
+    uint8_t* row(int r) const { return origin_ + static_cast<std::ptrdiff_t>(r) * shape_.step; }
     uint8_t* data() const { return origin_; }
-    const PlaneSpec& spec() const { return spec_; }
+    const PlaneShape& shape() const { return shape_; }
     bool inRegion(std::size_t offset) const; // offset into the block
     std::vector<uint8_t> bytes() const { return {block_.begin(), block_.end()}; }
     void restore(const std::vector<uint8_t>& b) const;
@@ -52,7 +52,7 @@ public:
     long firstGuardChange(const std::vector<uint8_t>& before) const;
 
 private:
-    PlaneSpec spec_;
+    PlaneShape shape_;
     PageBlock block_;
     uint8_t* origin_;
 };
