@@ -158,17 +158,22 @@ struct Io<InPlanar<P>> {
 template <int Bpp, Order O, Fourth F>
 struct Io<OutPacked<Bpp, O, F>> {
     static_assert(F != Fourth::Keep, "a kept fourth byte is never written: such rows have no block kernel");
+    // The fourth byte of each pixel, in 16-bit lanes.
+    static V fourthOf(const V3& v, const Ctx& ctx)
+    {
+        if constexpr (F == Fourth::Alpha)
+            return splat16(ctx.alpha);
+        else if constexpr (F == Fourth::Zero)
+            return _mm_setzero_si128();
+        else
+            return v.extra;
+    }
     static void put8(const typename OutPacked<Bpp, O, F>::Row& row, int x, const V3& v, const Ctx& ctx)
     {
         uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * Bpp;
         // a holds channels 0 and 1 (bytes 0..7, 8..15), b channel 2 and the fourth byte (0..7, 8..15).
         const V a = packUs(v.c[0], v.c[1]);
-        V fourth = v.extra;
-        if constexpr (F == Fourth::Alpha)
-            fourth = splat16(ctx.alpha);
-        else if constexpr (F == Fourth::Zero)
-            fourth = _mm_setzero_si128();
-        const V b = packUs(v.c[2], fourth);
+        const V b = packUs(v.c[2], fourthOf(v, ctx));
         auto part = [&]<int Base>() {
             V r = _mm_or_si128(_mm_shuffle_epi8(a, maskOf(kScatter<Bpp, Base, channelByte(O, 0), 0>)),
                                _mm_shuffle_epi8(a, maskOf(kScatter<Bpp, Base, channelByte(O, 1), 8>)));
@@ -182,15 +187,6 @@ struct Io<OutPacked<Bpp, O, F>> {
             store16(q + 16, part.template operator()<16>());
         else
             store8(q + 16, part.template operator()<16>());
-    }
-    static V fourthOf(const V3& v, const Ctx& ctx)
-    {
-        if constexpr (F == Fourth::Alpha)
-            return splat16(ctx.alpha);
-        else if constexpr (F == Fourth::Zero)
-            return _mm_setzero_si128();
-        else
-            return v.extra;
     }
     // Sixteen pixels: each channel packed once to sixteen bytes, then interleaved.
     static void put16(const typename OutPacked<Bpp, O, F>::Row& row, int x, const V3& a, const V3& b, const Ctx& ctx)
