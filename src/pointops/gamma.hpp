@@ -189,31 +189,20 @@ zoxStatus gammaRun(const T* const* src, bool srcArrayNull, int srcStep, T* const
     ::zox::gammaRun<T, D, L>(srcDst ? srcDst : ::zox::kNoPlanes<T>, !srcDst, srcDstStep,                          \
                              srcDst ? srcDst : ::zox::kNoPlanes<T>, !srcDst, srcDstStep, roiSize, range)
 
-#define ZOX_GAMMA_SD(name, T, D, L) \
-    ZOXCC_API zoxStatus name(ZOX_GAMMA_SD_ARGS(T)) { return ZOX_GAMMA_SD_CALL(T, D, L, {}); }
-#define ZOX_GAMMA_I(name, T, D, L) \
-    ZOXCC_API zoxStatus name(ZOX_GAMMA_I_ARGS(T)) { return ZOX_GAMMA_I_CALL(T, D, L, {}); }
-#define ZOX_GAMMA_P(name, T, D, L) \
-    ZOXCC_API zoxStatus name(ZOX_GAMMA_P_ARGS(T)) { return ZOX_GAMMA_P_CALL(T, D, L, {}); }
-#define ZOX_GAMMA_IP(name, T, D, L) \
-    ZOXCC_API zoxStatus name(ZOX_GAMMA_IP_ARGS(T)) { return ZOX_GAMMA_IP_CALL(T, D, L, {}); }
-#define ZOX_GAMMA_SD_RANGE(name, T, D, L)                                                   \
-    ZOXCC_API zoxStatus name(ZOX_GAMMA_SD_ARGS(T), float rangeLow, float rangeHigh)         \
-    {                                                                                       \
-        return ZOX_GAMMA_SD_CALL(T, D, L, (::zox::GammaRange{rangeLow, rangeHigh}));        \
-    }
-#define ZOX_GAMMA_I_RANGE(name, T, D, L)                                                    \
-    ZOXCC_API zoxStatus name(ZOX_GAMMA_I_ARGS(T), float rangeLow, float rangeHigh)          \
-    {                                                                                       \
-        return ZOX_GAMMA_I_CALL(T, D, L, (::zox::GammaRange{rangeLow, rangeHigh}));         \
-    }
-#define ZOX_GAMMA_P_RANGE(name, T, D, L)                                                    \
-    ZOXCC_API zoxStatus name(ZOX_GAMMA_P_ARGS(T), float rangeLow, float rangeHigh)          \
-    {                                                                                       \
-        return ZOX_GAMMA_P_CALL(T, D, L, (::zox::GammaRange{rangeLow, rangeHigh}));         \
-    }
-#define ZOX_GAMMA_IP_RANGE(name, T, D, L)                                                   \
-    ZOXCC_API zoxStatus name(ZOX_GAMMA_IP_ARGS(T), float rangeLow, float rangeHigh)         \
-    {                                                                                       \
-        return ZOX_GAMMA_IP_CALL(T, D, L, (::zox::GammaRange{rangeLow, rangeHigh}));        \
-    }
+#define ZOX_GAMMA_RANGE_ARGS , float rangeLow, float rangeHigh
+#define ZOX_GAMMA_RANGE (::zox::GammaRange{rangeLow, rangeHigh})
+#define ZOX_GAMMA_DEFINE(name, args, call) \
+    ZOXCC_API zoxStatus name(args) { return call; }
+
+#define ZOX_GAMMA_SD(name, T, D, L) ZOX_GAMMA_DEFINE(name, ZOX_GAMMA_SD_ARGS(T), ZOX_GAMMA_SD_CALL(T, D, L, {}))
+#define ZOX_GAMMA_I(name, T, D, L) ZOX_GAMMA_DEFINE(name, ZOX_GAMMA_I_ARGS(T), ZOX_GAMMA_I_CALL(T, D, L, {}))
+#define ZOX_GAMMA_P(name, T, D, L) ZOX_GAMMA_DEFINE(name, ZOX_GAMMA_P_ARGS(T), ZOX_GAMMA_P_CALL(T, D, L, {}))
+#define ZOX_GAMMA_IP(name, T, D, L) ZOX_GAMMA_DEFINE(name, ZOX_GAMMA_IP_ARGS(T), ZOX_GAMMA_IP_CALL(T, D, L, {}))
+#define ZOX_GAMMA_SD_RANGE(name, T, D, L) \
+    ZOX_GAMMA_DEFINE(name, ZOX_GAMMA_SD_ARGS(T) ZOX_GAMMA_RANGE_ARGS, ZOX_GAMMA_SD_CALL(T, D, L, ZOX_GAMMA_RANGE))
+#define ZOX_GAMMA_I_RANGE(name, T, D, L) \
+    ZOX_GAMMA_DEFINE(name, ZOX_GAMMA_I_ARGS(T) ZOX_GAMMA_RANGE_ARGS, ZOX_GAMMA_I_CALL(T, D, L, ZOX_GAMMA_RANGE))
+#define ZOX_GAMMA_P_RANGE(name, T, D, L) \
+    ZOX_GAMMA_DEFINE(name, ZOX_GAMMA_P_ARGS(T) ZOX_GAMMA_RANGE_ARGS, ZOX_GAMMA_P_CALL(T, D, L, ZOX_GAMMA_RANGE))
+#define ZOX_GAMMA_IP_RANGE(name, T, D, L) \
+    ZOX_GAMMA_DEFINE(name, ZOX_GAMMA_IP_ARGS(T) ZOX_GAMMA_RANGE_ARGS, ZOX_GAMMA_IP_CALL(T, D, L, ZOX_GAMMA_RANGE))

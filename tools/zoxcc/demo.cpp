@@ -66,36 +66,34 @@ std::vector<Image> channels(const Image& img)
     return out;
 }
 
-void yuvDemo(Demo& d)
+using Convert = zoxStatus (*)(const uint8_t*, int, uint8_t*, int, ImageSize);
+
+// The picture there and back through a pair of C3 conversions: the three planes of the way there and
+// the picture come back.
+void roundTrip(Demo& d, const char* there, Convert fwd, const char* back, Convert inv, const char* prefix,
+               const char* const (&planeNames)[3])
 {
     const Image& in = d.input();
     const ImageSize roi{in.width, in.height};
-    Image yuv(in.width, in.height, 3), back(in.width, in.height, 3);
-    d.time("zoxiRGBToYUV_8u_C3R", pixels(in) * 6,
-           [&] { return zoxiRGBToYUV_8u_C3R(in.data(), in.step(), yuv.data(), yuv.step(), roi); });
-    d.time("zoxiYUVToRGB_8u_C3R", pixels(in) * 6,
-           [&] { return zoxiYUVToRGB_8u_C3R(yuv.data(), yuv.step(), back.data(), back.step(), roi); });
-    const auto planes = channels(yuv);
-    d.write("yuv-y.pgm", planes[0]);
-    d.write("yuv-u.pgm", planes[1]);
-    d.write("yuv-v.pgm", planes[2]);
-    d.write("yuv-roundtrip.ppm", back);
+    Image mid(in.width, in.height, 3), out(in.width, in.height, 3);
+    d.time(there, pixels(in) * 6, [&] { return fwd(in.data(), in.step(), mid.data(), mid.step(), roi); });
+    d.time(back, pixels(in) * 6, [&] { return inv(mid.data(), mid.step(), out.data(), out.step(), roi); });
+    const auto planes = channels(mid);
+    const std::string p = prefix;
+    for (int k = 0; k < 3; ++k)
+        d.write(p + "-" + planeNames[k] + ".pgm", planes[k]);
+    d.write(p + "-roundtrip.ppm", out);
+}
+
+void yuvDemo(Demo& d)
+{
+    roundTrip(d, "zoxiRGBToYUV_8u_C3R", zoxiRGBToYUV_8u_C3R, "zoxiYUVToRGB_8u_C3R", zoxiYUVToRGB_8u_C3R, "yuv", {"y", "u", "v"});
 }
 
 void ycbcrDemo(Demo& d)
 {
-    const Image& in = d.input();
-    const ImageSize roi{in.width, in.height};
-    Image ycc(in.width, in.height, 3), back(in.width, in.height, 3);
-    d.time("zoxiRGBToYCbCr_8u_C3R", pixels(in) * 6,
-           [&] { return zoxiRGBToYCbCr_8u_C3R(in.data(), in.step(), ycc.data(), ycc.step(), roi); });
-    d.time("zoxiYCbCrToRGB_8u_C3R", pixels(in) * 6,
-           [&] { return zoxiYCbCrToRGB_8u_C3R(ycc.data(), ycc.step(), back.data(), back.step(), roi); });
-    const auto planes = channels(ycc);
-    d.write("ycbcr-y.pgm", planes[0]);
-    d.write("ycbcr-cb.pgm", planes[1]);
-    d.write("ycbcr-cr.pgm", planes[2]);
-    d.write("ycbcr-roundtrip.ppm", back);
+    roundTrip(d, "zoxiRGBToYCbCr_8u_C3R", zoxiRGBToYCbCr_8u_C3R, "zoxiYCbCrToRGB_8u_C3R", zoxiYCbCrToRGB_8u_C3R, "ycbcr",
+              {"y", "cb", "cr"});
 }
 
 void gammaDemo(Demo& d)
