@@ -50,6 +50,10 @@ namespace sse41 {
 template <class C>
 void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx);
 }
+namespace avx2 {
+template <class C>
+void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx);
+}
 namespace portable {
 template <class C>
 void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx)
@@ -58,7 +62,10 @@ void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n,
 }
 } // namespace portable
 
-#if defined(ZOX_ISA_SSE41)
+// The flavour is chosen when building, never at run time.
+#if defined(ZOX_ISA_AVX2)
+namespace isa = avx2;
+#elif defined(ZOX_ISA_SSE41)
 namespace isa = sse41;
 #else
 namespace isa = portable;

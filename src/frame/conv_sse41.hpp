@@ -235,9 +235,10 @@ struct Io<OutPlanar<P>> {
 };
 
 // A group of fewer than eight pixels (the 4-pixel blocks of N = 4 rows): staged through small buffers
-// so that no vector access leaves the region.
-template <class C>
-void stagedGroup(const typename C::Src::Row& s, const typename C::Dst::Row& d, int x, int count, const Ctx& ctx)
+// so that no vector access leaves the region. run8(src, dst) converts the eight pixels at the start of
+// the staged rows.
+template <class C, class Run8>
+void stagedGroup(const typename C::Src::Row& s, const typename C::Dst::Row& d, int x, int count, Run8&& run8)
 {
     using Src = typename C::Src;
     using Dst = typename C::Dst;
@@ -252,9 +253,7 @@ void stagedGroup(const typename C::Src::Row& s, const typename C::Dst::Row& d, i
     }
     for (int p = 0; p < Dst::planes; ++p)
         ld.p[p] = out[p];
-    V3 v = Io<Src>::template get8<inputShift<typename C::Block>>(ls, 0);
-    Simd<typename C::Block>::apply(v);
-    Io<Dst>::put8(ld, 0, v, ctx);
+    run8(ls, ld);
     for (int p = 0; p < Dst::planes; ++p)
         std::memcpy(d.p[p] + static_cast<std::size_t>(x) * Dst::bytesPerPixel, out[p],
                     static_cast<std::size_t>(count) * Dst::bytesPerPixel);
@@ -276,14 +275,17 @@ void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n,
             F::apply(b);
             Out::put16(d, x, a, b, ctx);
         }
-        if (x + 8 <= n) {
-            V3 v = In::template get8<shift>(s, x);
+        auto run8 = [&](const typename C::Src::Row& s8, const typename C::Dst::Row& d8, int at) {
+            V3 v = In::template get8<shift>(s8, at);
             F::apply(v);
-            Out::put8(d, x, v, ctx);
+            Out::put8(d8, at, v, ctx);
+        };
+        if (x + 8 <= n) {
+            run8(s, d, x);
             x += 8;
         }
         if (x < n)
-            stagedGroup<C>(s, d, x, n - x, ctx);
+            stagedGroup<C>(s, d, x, n - x, [&](const auto& s8, const auto& d8) { run8(s8, d8, 0); });
     }
 }
 

@@ -9,6 +9,12 @@ namespace zox::sse41 {
 
 using V = __m128i;
 
+// A constant in every lane; the constant is a template argument so that it can live in constant data.
+template <int K>
+inline V splat16()
+{
+    return _mm_set1_epi16(static_cast<short>(K));
+}
 inline V splat16(int k) { return _mm_set1_epi16(static_cast<short>(k)); }
 inline V mulHigh(V a, V k) { return _mm_mulhi_epi16(a, k); }
 inline V mulHighU(V a, V k) { return _mm_mulhi_epu16(a, k); }

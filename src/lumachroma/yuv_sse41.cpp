@@ -1,84 +1,9 @@
-// RGB <-> YUV block forms over eight 16-bit lanes. Samples sit in the upper byte of a lane (256 x) or
-// one bit lower (128 x) so that one multiply-high does each scaling.
+// SSE4.1 block kernels of the RGB <-> YUV family.
 #include "frame/conv_sse41.hpp"
 #include "lumachroma/yuv_table.hpp"
 
 namespace zox::sse41 {
-
-template <>
-struct Simd<YuvFromRgbMatrix> {
-    using K = YuvMatrixForward;
-    static constexpr int inputShift = 8; // samples arrive at 256 x
-    static void apply(V3& v)
-    {
-        const V r8 = v.c[0], g8 = v.c[1], b8 = v.c[2];
-        const V r7 = shrU<1>(r8), g7 = shrU<1>(g8), b7 = shrU<1>(b8);
-        // The luma sum stays below 65536, so plain 16-bit adds hold it.
-        const V y = shrU<8>(add(add(mulHighU(r8, splat16(K::yR)), mulHighU(g8, splat16(K::yG))), mulHighU(b8, splat16(K::yB))));
-        auto chroma = [&](int kr, int kg, int kb) {
-            const V s = add(add(mulHigh(r7, splat16(kr)), mulHigh(g7, splat16(kg))), mulHigh(b7, splat16(kb)));
-            return add(shr<6>(s), splat16(128));
-        };
-        v.c[0] = y;
-        v.c[1] = chroma(K::uR, K::uG, K::uB);
-        v.c[2] = chroma(K::vR, K::vG, K::vB);
-    }
-};
-
-template <>
-struct Simd<YuvFromRgbHalf> {
-    using K = YuvHalfForward;
-    static void apply(V3& v)
-    {
-        const V r = v.c[0], g = v.c[1], b = v.c[2];
-        const V s = add(add(add(mulHigh(shl<2>(r), splat16(K::yR)), mulHigh(shl<2>(b), splat16(K::yB))),
-                            mulHigh(shl<2>(g), splat16(K::yG))),
-                        splat16(1));
-        v.c[0] = shr<1>(s);
-        v.c[1] = add(mulHigh(sub(shl<1>(b), s), splat16(K::uGain)), splat16(128));
-        v.c[2] = add(mulHigh(sub(shl<1>(r), s), splat16(K::vGain)), splat16(128));
-    }
-};
-
-template <>
-struct Simd<RgbFromYuvBlock8> {
-    static constexpr YuvInverseGains K = YuvInverseBlock8;
-    static void apply(V3& v)
-    {
-        const V y = v.c[0];
-        const V a = shl<3>(sub(v.c[1], splat16(128))), b = shl<3>(sub(v.c[2], splat16(128)));
-        v.c[0] = add(y, mulHigh(b, splat16(K.vR)));
-        v.c[1] = add(add(y, mulHigh(a, splat16(K.uG))), mulHigh(b, splat16(K.vG)));
-        v.c[2] = add(y, mulHigh(a, splat16(K.uB)));
-    }
-};
-
-template <>
-struct Simd<RgbFromYuvBlock16> {
-    static constexpr YuvInverseGains K = YuvInverseBlock16;
-    static void apply(V3& v)
-    {
-        const V y2 = shl<1>(v.c[0]);
-        const V a = shl<4>(sub(v.c[1], splat16(128))), b = shl<4>(sub(v.c[2], splat16(128)));
-        v.c[0] = shr<1>(add(y2, mulHigh(b, splat16(K.vR))));
-        v.c[1] = shr<1>(add(add(y2, mulHigh(a, splat16(K.uG))), mulHigh(b, splat16(K.vG))));
-        v.c[2] = shr<1>(add(y2, mulHigh(a, splat16(K.uB))));
-    }
-};
-
-template <>
-struct Simd<RgbFromYuvBlock128> {
-    static constexpr YuvInverseGains K = YuvInverseBlock128;
-    static void apply(V3& v)
-    {
-        const V y8 = add(shl<3>(v.c[0]), splat16(4));
-        const V a = shl<7>(sub(v.c[1], splat16(128))), b = shl<7>(sub(v.c[2], splat16(128)));
-        v.c[0] = shr<3>(add(y8, mulHigh(b, splat16(K.vR))));
-        v.c[1] = shr<3>(sub(sub(y8, mulHigh(b, splat16(-K.vG))), mulHigh(a, splat16(-K.uG))));
-        v.c[2] = shr<3>(add(y8, mulHigh(a, splat16(K.uB))));
-    }
-};
+#include "lumachroma/yuv_simd.inl"
 
 ZOX_YUV_TABLE(ZOX_SSE41_INSTANTIATE)
-
 } // namespace zox::sse41

@@ -13,9 +13,9 @@ ZOX_CONV_TABLES(ZT_SWEEP)
     TEST(Validation, name) { zt::checkValidation<Conv<Src, Dst, N, Block, Rem, Chk>>(#name, &name); }
 ZOX_CONV_TABLES(ZT_VALIDATION)
 
-#if defined(ZOX_ISA_SSE41)
+#if defined(ZOX_ISA_SSE41) || defined(ZOX_ISA_AVX2)
 #define ZT_KERNEL(name, shape, Src, Dst, N, Block, Rem, Chk)                 \
-    TEST(BlockKernelSse41, name)                                             \
+    TEST(BlockKernelSimd, name)                                             \
     {                                                                        \
         if (N == 1)                                                          \
             GTEST_SKIP() << "one form in all columns";                       \

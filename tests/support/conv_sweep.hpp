@@ -252,8 +252,8 @@ std::array<int, 3> pixelAt(F f, std::array<int, 3> in, int x, int w)
     return out;
 }
 
-#if defined(ZOX_ISA_SSE41)
-// The SIMD block kernel against the scalar block kernel: block counts 1..12 and random, every
+#if defined(ZOX_ISA_SSE41) || defined(ZOX_ISA_AVX2)
+// The flavour's SIMD block kernel against the scalar block kernel: block counts 1..12 and random, every
 // misalignment of source and destination, buffers ending at a PROT_NONE page, random and corner data;
 // then every possible three-channel input once.
 template <class C>
@@ -270,7 +270,7 @@ void diffKernel()
             b.restore(a.bytes());
             const zox::Ctx ctx{static_cast<uint8_t>(rng())};
             const auto s = Src::row(src.arg(), src.step, 0);
-            zox::sse41::blocks<C>(s, Dst::row(a.arg(), a.step, 0), n, ctx);
+            zox::isa::blocks<C>(s, Dst::row(a.arg(), a.step, 0), n, ctx);
             zox::scalarBlocks<C>(s, Dst::row(b.arg(), b.step, 0), n, ctx);
             for (int p = 0; p < Dst::planes; ++p)
                 ASSERT_EQ(a.planes[p]->bytes(), b.planes[p]->bytes()) << "n " << n << " plane " << p;

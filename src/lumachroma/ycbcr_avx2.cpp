@@ -1,0 +1,9 @@
+// AVX2 block kernels of the RGB <-> YCbCr family.
+#include "frame/conv_avx2.hpp"
+#include "lumachroma/ycbcr_table.hpp"
+
+namespace zox::avx2 {
+#include "lumachroma/ycbcr_simd.inl"
+
+ZOX_YCBCR_TABLE(ZOX_AVX2_INSTANTIATE)
+} // namespace zox::avx2

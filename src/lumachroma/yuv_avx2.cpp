@@ -1,0 +1,9 @@
+// AVX2 block kernels of the RGB <-> YUV family.
+#include "frame/conv_avx2.hpp"
+#include "lumachroma/yuv_table.hpp"
+
+namespace zox::avx2 {
+#include "lumachroma/yuv_simd.inl"
+
+ZOX_YUV_TABLE(ZOX_AVX2_INSTANTIATE)
+} // namespace zox::avx2
