@@ -1,7 +1,8 @@
-// AVX2 side of the generic conversion. The pixels move through the 128-bit readers and writers (in
-// this flavour they are VEX-encoded), sixteen at a time, and the block form runs once over sixteen
-// 16-bit lanes: the first eight pixels in the lower half of each vector, the next eight in the upper.
-// Included only by *_avx2.cpp files.
+// AVX2 side of the generic conversion: the generic readers and writers over 256-bit vectors (two lanes:
+// thirty-two pixels a turn, the second group of sixteen in the upper lane), and the block kernel that
+// runs a family's block form over sixteen 16-bit lanes. The shorter groups at the end of a run go
+// through the 128-bit readers and writers, their halves joined into one vector. Included only by
+// *_avx2.cpp files.
 #pragma once
 
 #include "frame/conv_sse41.hpp"
@@ -9,26 +10,7 @@
 
 namespace zox::avx2 {
 
-// Sixteen pixels: three colour channels and the carried fourth byte, 16 bits a lane.
-struct V3 {
-    V c[3];
-    V extra;
-};
-
-// A family's block form over sixteen lanes, in place (see sse41::Simd).
-template <class Form>
-struct Simd;
-
-template <class Form>
-constexpr int inputShiftOf()
-{
-    if constexpr (requires { Simd<Form>::inputShift; })
-        return Simd<Form>::inputShift;
-    else
-        return 0;
-}
-template <class Form>
-inline constexpr int inputShift = inputShiftOf<Form>();
+#include "frame/io_simd.inl"
 
 inline V join(__m128i lo, __m128i hi)
 {
@@ -56,30 +38,37 @@ inline void split(const V3& v, sse41::V3& lo, sse41::V3& hi)
     hi = {{upper(v.c[0]), upper(v.c[1]), upper(v.c[2])}, upper(v.extra)};
 }
 
+// Groups of thirty-two, then sixteen, eight and a staged four; n is a multiple of N.
 template <class C>
 void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx)
 {
     if constexpr (C::N > 1) {
-        using In = sse41::Io<typename C::Src>;
-        using Out = sse41::Io<typename C::Dst>;
         using F = Simd<typename C::Block>;
         constexpr int shift = inputShift<typename C::Block>;
         int x = 0;
-        for (; x + 16 <= n; x += 16) {
+        for (; x + 32 <= n; x += 32) {
+            V3 a, b;
+            GroupIo<typename C::Src>::template get<shift>(s, x, a, b);
+            F::apply(a);
+            F::apply(b);
+            GroupIo<typename C::Dst>::put(d, x, a, b, ctx);
+        }
+        if (x + 16 <= n) {
             sse41::V3 a, b;
-            In::template get16<shift>(s, x, a, b);
+            sse41::GroupIo<typename C::Src>::template get<shift>(s, x, a, b);
             V3 v = join(a, b);
             F::apply(v);
             split(v, a, b);
-            Out::put16(d, x, a, b, ctx);
+            sse41::GroupIo<typename C::Dst>::put(d, x, a, b, ctx);
+            x += 16;
         }
         // Eight pixels, or four staged: the upper half of the vector repeats the lower one.
         auto run8 = [&](const typename C::Src::Row& s8, const typename C::Dst::Row& d8, int at) {
-            sse41::V3 a = In::template get8<shift>(s8, at), b;
+            sse41::V3 a = sse41::Io8<typename C::Src>::template get<shift>(s8, at), b;
             V3 v = join(a, a);
             F::apply(v);
             split(v, a, b);
-            Out::put8(d8, at, a, ctx);
+            sse41::Io8<typename C::Dst>::put(d8, at, a, ctx);
         };
         if (x + 8 <= n) {
             run8(s, d, x);

@@ -2,8 +2,11 @@
 // names as the SSE4.1 set, so that one definition of each SIMD form serves both flavours.
 #pragma once
 
+#include "frame/shuffle_masks.hpp"
+
 #include <immintrin.h>
 
+#include <cstddef>
 #include <cstdint>
 
 namespace zox::avx2 {
@@ -30,5 +33,33 @@ inline V sub(V a, V b) { return _mm256_sub_epi16(a, b); }
 template <int S> inline V shl(V a) { return _mm256_slli_epi16(a, S); }
 template <int S> inline V shr(V a) { return _mm256_srai_epi16(a, S); }
 template <int S> inline V shrU(V a) { return _mm256_srli_epi16(a, S); }
+
+inline V splat16(int k) { return _mm256_set1_epi16(static_cast<short>(k)); }
+
+// The rest of the vocabulary of the generic readers and writers: two lanes, each a group of sixteen
+// pixels, the second group g bytes after the first. Byte shuffles and unpacks work within a lane.
+inline V zero() { return _mm256_setzero_si256(); }
+inline V maskOf(const Bytes16& m) { return _mm256_broadcastsi128_si256(_mm_load_si128(reinterpret_cast<const __m128i*>(m.b))); }
+inline V shuffle(V a, V m) { return _mm256_shuffle_epi8(a, m); }
+inline V or_(V a, V b) { return _mm256_or_si256(a, b); }
+inline V packUs(V a, V b) { return _mm256_packus_epi16(a, b); }
+inline V unpackLo8(V a, V b) { return _mm256_unpacklo_epi8(a, b); }
+inline V unpackHi8(V a, V b) { return _mm256_unpackhi_epi8(a, b); }
+inline V unpackLo16(V a, V b) { return _mm256_unpacklo_epi16(a, b); }
+inline V unpackHi16(V a, V b) { return _mm256_unpackhi_epi16(a, b); }
+// Contiguous lanes (a plane's bytes, g = 16) move as one 256-bit access.
+inline V loadLanes(const uint8_t* q, std::size_t g)
+{
+    if (g == 16)
+        return _mm256_loadu_si256(reinterpret_cast<const V*>(q));
+    return _mm256_loadu2_m128i(reinterpret_cast<const __m128i*>(q + g), reinterpret_cast<const __m128i*>(q));
+}
+inline void storeLanes(uint8_t* q, std::size_t g, V v)
+{
+    if (g == 16)
+        _mm256_storeu_si256(reinterpret_cast<V*>(q), v);
+    else
+        _mm256_storeu2_m128i(reinterpret_cast<__m128i*>(q + g), reinterpret_cast<__m128i*>(q), v);
+}
 
 } // namespace zox::avx2

@@ -1,8 +1,11 @@
 // The fixed-point vocabulary over 128-bit vectors of eight 16-bit lanes (SSE4.1 files only).
 #pragma once
 
+#include "frame/shuffle_masks.hpp"
+
 #include <smmintrin.h>
 
+#include <cstddef>
 #include <cstdint>
 
 namespace zox::sse41 {
@@ -56,5 +59,17 @@ inline void store4(uint8_t* p, V v)
     const int32_t x = _mm_cvtsi128_si32(v);
     __builtin_memcpy(p, &x, 4);
 }
+
+// The rest of the vocabulary of the generic readers and writers: one lane of sixteen pixels.
+inline V zero() { return _mm_setzero_si128(); }
+inline V maskOf(const Bytes16& m) { return _mm_load_si128(reinterpret_cast<const V*>(m.b)); }
+inline V shuffle(V a, V m) { return _mm_shuffle_epi8(a, m); }
+inline V or_(V a, V b) { return _mm_or_si128(a, b); }
+inline V unpackLo8(V a, V b) { return _mm_unpacklo_epi8(a, b); }
+inline V unpackHi8(V a, V b) { return _mm_unpackhi_epi8(a, b); }
+inline V unpackLo16(V a, V b) { return _mm_unpacklo_epi16(a, b); }
+inline V unpackHi16(V a, V b) { return _mm_unpackhi_epi16(a, b); }
+inline V loadLanes(const uint8_t* q, std::size_t) { return load16(q); }
+inline void storeLanes(uint8_t* q, std::size_t, V v) { store16(q, v); }
 
 } // namespace zox::sse41

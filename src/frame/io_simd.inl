@@ -1,0 +1,147 @@
+// The generic SIMD side of a conversion, written once against the vocabulary of an instruction set and
+// included inside its namespace: the pixel vectors, the hook for a family's block forms, and readers and
+// writers that move sixteen pixels through each 128-bit lane of a vector. Samples travel in 16-bit lanes
+// (values in the low byte, or at 256 x when a form asks), and are written back with unsigned
+// saturation (clip8).
+//
+// The vocabulary: V, zero(), maskOf(Bytes16), shuffle, or_, packUs, unpackLo8/Hi8, unpackLo16/Hi16,
+// splat16(int), and loadLanes(q, g) / storeLanes(q, g, v), which move 16 bytes at q for the first lane
+// and 16 bytes at q + g for the next one (the next group of sixteen pixels, g bytes on).
+
+// The pixels of one vector: three colour channels and the carried fourth byte.
+struct V3 {
+    V c[3];
+    V extra;
+};
+
+// A family's block form, in place; results leave in 16-bit lanes before clip8. A form that wants its
+// samples at 256 x declares `static constexpr int inputShift = 8`.
+template <class Form>
+struct Simd;
+
+template <class Form>
+constexpr int inputShiftOf()
+{
+    if constexpr (requires { Simd<Form>::inputShift; })
+        return Simd<Form>::inputShift;
+    else
+        return 0;
+}
+template <class Form>
+inline constexpr int inputShift = inputShiftOf<Form>();
+
+// Readers and writers of sixteen pixels a lane: `a` holds pixels 0..7 of each lane's group, `b` 8..15.
+template <class L>
+struct GroupIo;
+
+template <int Bpp, Order O>
+struct GroupIo<InPacked<Bpp, O>> {
+    // Lanes of the pixels whose bytes start at `First` of the register pair lo (at Base), hi (Base + 16).
+    template <int First, int Base, int Shift>
+    static V gather(V lo, V hi)
+    {
+        return or_(shuffle(lo, maskOf(kGather<First, Bpp, Base, Shift>)),
+                   shuffle(hi, maskOf(kGather<First, Bpp, Base + 16, Shift>)));
+    }
+    template <int Start, int Base, int Shift>
+    static V3 split(V lo, V hi)
+    {
+        return {{gather<Start + channelByte(O, 0), Base, Shift>(lo, hi), gather<Start + channelByte(O, 1), Base, Shift>(lo, hi),
+                 gather<Start + channelByte(O, 2), Base, Shift>(lo, hi)},
+                Bpp == 4 ? gather<Start + 3, Base, 0>(lo, hi) : zero()};
+    }
+    template <int Shift>
+    static void get(const typename InPacked<Bpp, O>::Row& row, int x, V3& a, V3& b)
+    {
+        constexpr std::size_t g = 16 * Bpp;
+        const uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * Bpp;
+        const V r0 = loadLanes(q, g), r1 = loadLanes(q + 16, g), r2 = loadLanes(q + 32, g);
+        a = split<0, 0, Shift>(r0, r1);
+        if constexpr (Bpp == 3)
+            b = split<24, 16, Shift>(r1, r2); // pixels 8..15: bytes 24..47
+        else
+            b = split<32, 32, Shift>(r2, loadLanes(q + 48, g));
+    }
+};
+
+template <int P>
+struct GroupIo<InPlanar<P>> {
+    template <int Shift>
+    static V widenLo(V x)
+    {
+        return Shift == 0 ? unpackLo8(x, zero()) : unpackLo8(zero(), x);
+    }
+    template <int Shift>
+    static V widenHi(V x)
+    {
+        return Shift == 0 ? unpackHi8(x, zero()) : unpackHi8(zero(), x);
+    }
+    template <int Shift>
+    static void get(const typename InPlanar<P>::Row& row, int x, V3& a, V3& b)
+    {
+        for (int k = 0; k < 3; ++k) {
+            const V r = loadLanes(row.p[k] + x, 16);
+            a.c[k] = widenLo<Shift>(r);
+            b.c[k] = widenHi<Shift>(r);
+        }
+        if constexpr (P == 4) {
+            const V r = loadLanes(row.p[3] + x, 16);
+            a.extra = widenLo<0>(r);
+            b.extra = widenHi<0>(r);
+        } else {
+            a.extra = b.extra = zero();
+        }
+    }
+};
+
+template <int Bpp, Order O, Fourth F>
+struct GroupIo<OutPacked<Bpp, O, F>> {
+    static_assert(F != Fourth::Keep, "a kept fourth byte is never written: such rows have no block kernel");
+    // The fourth byte of each pixel, in 16-bit lanes.
+    static V fourthOf(const V3& v, const Ctx& ctx)
+    {
+        if constexpr (F == Fourth::Alpha)
+            return splat16(ctx.alpha);
+        else if constexpr (F == Fourth::Zero)
+            return zero();
+        else
+            return v.extra;
+    }
+    // Each channel packed once to sixteen bytes a lane, then interleaved.
+    static void put(const typename OutPacked<Bpp, O, F>::Row& row, int x, const V3& a, const V3& b, const Ctx& ctx)
+    {
+        constexpr std::size_t g = 16 * Bpp;
+        uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * Bpp;
+        V ch[3];
+        for (int k = 0; k < 3; ++k)
+            ch[k] = packUs(a.c[channelByte(O, k)], b.c[channelByte(O, k)]); // ch[slot]: bytes of that slot
+        if constexpr (Bpp == 3) {
+            auto part = [&]<int Base>() {
+                return or_(or_(shuffle(ch[0], maskOf(kScatter<3, Base, 0, 0>)), shuffle(ch[1], maskOf(kScatter<3, Base, 1, 0>))),
+                           shuffle(ch[2], maskOf(kScatter<3, Base, 2, 0>)));
+            };
+            storeLanes(q, g, part.template operator()<0>());
+            storeLanes(q + 16, g, part.template operator()<16>());
+            storeLanes(q + 32, g, part.template operator()<32>());
+        } else {
+            const V c3 = packUs(fourthOf(a, ctx), fourthOf(b, ctx));
+            const V lo01 = unpackLo8(ch[0], ch[1]), hi01 = unpackHi8(ch[0], ch[1]);
+            const V lo23 = unpackLo8(ch[2], c3), hi23 = unpackHi8(ch[2], c3);
+            storeLanes(q, g, unpackLo16(lo01, lo23));
+            storeLanes(q + 16, g, unpackHi16(lo01, lo23));
+            storeLanes(q + 32, g, unpackLo16(hi01, hi23));
+            storeLanes(q + 48, g, unpackHi16(hi01, hi23));
+        }
+    }
+};
+
+template <int P>
+struct GroupIo<OutPlanar<P>> {
+    static void put(const typename OutPlanar<P>::Row& row, int x, const V3& a, const V3& b, const Ctx&)
+    {
+        for (int k = 0; k < 3; ++k)
+            storeLanes(row.p[k] + x, 16, packUs(a.c[k], b.c[k]));
+        if constexpr (P == 4)
+            storeLanes(row.p[3] + x, 16, packUs(a.extra, b.extra));
+    }
+};
