@@ -45,14 +45,7 @@ void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n,
     if constexpr (C::N > 1) {
         using F = Simd<typename C::Block>;
         constexpr int shift = inputShift<typename C::Block>;
-        int x = 0;
-        for (; x + 32 <= n; x += 32) {
-            V3 a, b;
-            GroupIo<typename C::Src>::template get<shift>(s, x, a, b);
-            F::apply(a);
-            F::apply(b);
-            GroupIo<typename C::Dst>::put(d, x, a, b, ctx);
-        }
+        int x = wholeGroups<C>(s, d, n, ctx);
         if (x + 16 <= n) {
             sse41::V3 a, b;
             sse41::GroupIo<typename C::Src>::template get<shift>(s, x, a, b);

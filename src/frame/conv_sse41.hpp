@@ -108,14 +108,7 @@ void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n,
     if constexpr (C::N > 1) {
         using F = Simd<typename C::Block>;
         constexpr int shift = inputShift<typename C::Block>;
-        int x = 0;
-        for (; x + 16 <= n; x += 16) {
-            V3 a, b;
-            GroupIo<typename C::Src>::template get<shift>(s, x, a, b);
-            F::apply(a);
-            F::apply(b);
-            GroupIo<typename C::Dst>::put(d, x, a, b, ctx);
-        }
+        int x = wholeGroups<C>(s, d, n, ctx);
         auto run8 = [&](const typename C::Src::Row& s8, const typename C::Dst::Row& d8, int at) {
             V3 v = Io8<typename C::Src>::template get<shift>(s8, at);
             F::apply(v);

@@ -5,8 +5,9 @@
 // saturation (clip8).
 //
 // The vocabulary: V, zero(), maskOf(Bytes16), shuffle, or_, packUs, unpackLo8/Hi8, unpackLo16/Hi16,
-// splat16(int), and loadLanes(q, g) / storeLanes(q, g, v), which move 16 bytes at q for the first lane
-// and 16 bytes at q + g for the next one (the next group of sixteen pixels, g bytes on).
+// splat16(int), loadLanes(q, g) / storeLanes(q, g, v), which move 16 bytes at q for the first lane
+// and 16 bytes at q + g for the next one (the next group of sixteen pixels, g bytes on), and
+// kGroupPixels, the pixels of one turn (sixteen a lane).
 
 // The pixels of one vector: three colour channels and the carried fourth byte.
 struct V3 {
@@ -145,3 +146,19 @@ struct GroupIo<OutPlanar<P>> {
             storeLanes(row.p[3] + x, 16, packUs(a.extra, b.extra));
     }
 };
+
+// The whole groups of a run of n block pixels; returns the pixels done, the rest being fewer than a group.
+template <class C>
+int wholeGroups(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx)
+{
+    using F = Simd<typename C::Block>;
+    int x = 0;
+    for (; x + kGroupPixels <= n; x += kGroupPixels) {
+        V3 a, b;
+        GroupIo<typename C::Src>::template get<inputShift<typename C::Block>>(s, x, a, b);
+        F::apply(a);
+        F::apply(b);
+        GroupIo<typename C::Dst>::put(d, x, a, b, ctx);
+    }
+    return x;
+}

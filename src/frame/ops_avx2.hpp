@@ -38,6 +38,7 @@ inline V splat16(int k) { return _mm256_set1_epi16(static_cast<short>(k)); }
 
 // The rest of the vocabulary of the generic readers and writers: two lanes, each a group of sixteen
 // pixels, the second group g bytes after the first. Byte shuffles and unpacks work within a lane.
+inline constexpr int kGroupPixels = 32;
 inline V zero() { return _mm256_setzero_si256(); }
 inline V maskOf(const Bytes16& m) { return _mm256_broadcastsi128_si256(_mm_load_si128(reinterpret_cast<const __m128i*>(m.b))); }
 inline V shuffle(V a, V m) { return _mm256_shuffle_epi8(a, m); }

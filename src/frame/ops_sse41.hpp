@@ -61,6 +61,7 @@ inline void store4(uint8_t* p, V v)
 }
 
 // The rest of the vocabulary of the generic readers and writers: one lane of sixteen pixels.
+inline constexpr int kGroupPixels = 16;
 inline V zero() { return _mm_setzero_si128(); }
 inline V maskOf(const Bytes16& m) { return _mm_load_si128(reinterpret_cast<const V*>(m.b)); }
 inline V shuffle(V a, V m) { return _mm_shuffle_epi8(a, m); }
