@@ -63,12 +63,7 @@ void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n,
             split(v, a, b);
             sse41::Io8<typename C::Dst>::put(d8, at, a, ctx);
         };
-        if (x + 8 <= n) {
-            run8(s, d, x);
-            x += 8;
-        }
-        if (x < n)
-            sse41::stagedGroup<C>(s, d, x, n - x, [&](const auto& s8, const auto& d8) { run8(s8, d8, 0); });
+        sse41::eightThenStaged<C>(s, d, x, n, run8);
     }
 }
 

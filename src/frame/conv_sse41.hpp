@@ -101,6 +101,19 @@ void stagedGroup(const typename C::Src::Row& s, const typename C::Dst::Row& d, i
                     static_cast<std::size_t>(count) * Dst::bytesPerPixel);
 }
 
+// The tail of a run of block pixels after its whole groups, x on: one group of eight, then a staged
+// group of four. run8(src, dst, at) converts the eight pixels at `at`.
+template <class C, class Run8>
+void eightThenStaged(const typename C::Src::Row& s, const typename C::Dst::Row& d, int x, int n, Run8&& run8)
+{
+    if (x + 8 <= n) {
+        run8(s, d, x);
+        x += 8;
+    }
+    if (x < n)
+        stagedGroup<C>(s, d, x, n - x, [&](const auto& s8, const auto& d8) { run8(s8, d8, 0); });
+}
+
 // Groups of sixteen, then one of eight, then a staged group of four; n is a multiple of N.
 template <class C>
 void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx)
@@ -108,18 +121,13 @@ void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n,
     if constexpr (C::N > 1) {
         using F = Simd<typename C::Block>;
         constexpr int shift = inputShift<typename C::Block>;
-        int x = wholeGroups<C>(s, d, n, ctx);
+        const int x = wholeGroups<C>(s, d, n, ctx);
         auto run8 = [&](const typename C::Src::Row& s8, const typename C::Dst::Row& d8, int at) {
             V3 v = Io8<typename C::Src>::template get<shift>(s8, at);
             F::apply(v);
             Io8<typename C::Dst>::put(d8, at, v, ctx);
         };
-        if (x + 8 <= n) {
-            run8(s, d, x);
-            x += 8;
-        }
-        if (x < n)
-            stagedGroup<C>(s, d, x, n - x, [&](const auto& s8, const auto& d8) { run8(s8, d8, 0); });
+        eightThenStaged<C>(s, d, x, n, run8);
     }
 }
 
