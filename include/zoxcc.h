@@ -101,7 +101,10 @@ enum {
 
 /* ---- Version --------------------------------------------------------------------------------------- */
 
-/* Returns the version record; the record's name ends in "+" when the core services report feature 128. */
+/* Returns the version record; the record's name ends in "+" when the core services report feature 128
+ * (AVX2, with the operating system saving its register state). The library holds SSE4.1 and AVX2
+ * kernels of the same bytes and chooses once, while it loads, from the same feature word: the "+"
+ * record names exactly the processors that run the AVX2 kernels. */
 ZOXCC_API const LibraryVersion* zoxccGetLibVersion(void);
 
 /* ---- RGB <-> YUV, 8u, full resolution ----------------------------------------------------------------

@@ -1,7 +1,8 @@
 // zoxcore: working memory, cache size and processor features for zoxcc.
 #include "zoxcore.h"
 
-#include <cpuid.h>
+#include "core/cpu_features.hpp"
+
 #include <unistd.h>
 
 #include <cstdlib>
@@ -11,44 +12,10 @@ namespace {
 
 constexpr std::size_t kAlignment = 64;
 
-bool osSavesAvxState()
-{
-    unsigned a = 0, b = 0, c = 0, d = 0;
-    if (!__get_cpuid(1, &a, &b, &c, &d) || !(c & bit_OSXSAVE))
-        return false;
-    unsigned lo = 0, hi = 0;
-    __asm__("xgetbv" : "=a"(lo), "=d"(hi) : "c"(0));
-    return (lo & 6u) == 6u; // XMM and YMM state
-}
-
-uint64_t detectFeatures()
-{
-    unsigned a = 0, b = 0, c = 0, d = 0;
-    if (!__get_cpuid(1, &a, &b, &c, &d))
-        return 0;
-    uint64_t f = 0;
-    if (d & bit_SSE2) f |= zoxCpuSse2;
-    if (c & bit_SSE3) f |= zoxCpuSse3;
-    if (c & bit_SSSE3) f |= zoxCpuSsse3;
-    if (c & bit_SSE4_1) f |= zoxCpuSse41;
-    if (c & bit_SSE4_2) f |= zoxCpuSse42;
-    if (c & bit_POPCNT) f |= zoxCpuPopcnt;
-    const bool avxState = osSavesAvxState();
-    if (avxState && (c & bit_AVX)) f |= zoxCpuAvx;
-    unsigned a7 = 0, b7 = 0, c7 = 0, d7 = 0;
-    if (avxState && __get_cpuid_count(7, 0, &a7, &b7, &c7, &d7)) {
-        if (b7 & bit_AVX2) f |= zoxCpuAvx2;
-        unsigned lo = 0, hi = 0;
-        __asm__("xgetbv" : "=a"(lo), "=d"(hi) : "c"(0));
-        if ((b7 & bit_AVX512F) && (lo & 0xE0u) == 0xE0u) f |= zoxCpuAvx512f;
-    }
-    return f;
-}
-
 // Computed once; the first caller's thread runs the detection and the rest wait on it.
 uint64_t features()
 {
-    static const uint64_t value = detectFeatures();
+    static const uint64_t value = zox::core::featureWordOf(zox::core::readCpuidWords());
     return value;
 }
 

@@ -1,11 +1,12 @@
 // A conversion of one pixel layout into another through a per-pixel block form and remainder form, and
 // the one row walk and validating layer that all such exports share.
 //
-// Row rule: the columns below the width rounded down to N take the block form (through the active
-// instruction set's block kernel), the columns from there on take the remainder form, in scalar code,
-// in every build. N = 1 means one form for the whole row.
+// Row rule: the columns below the width rounded down to N take the block form, the columns from there
+// on take the remainder form. N = 1 means one form for the whole row. Each form is defined once, in
+// scalar code; any kernel, block or whole-row, is a checked fast path of it.
 #pragma once
 
+#include "frame/kernel_set.hpp"
 #include "frame/layouts.hpp"
 #include "zoxcc.h"
 
@@ -45,31 +46,21 @@ void scalarBlocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, 
             C::Dst::store(d, x, C::Block::apply(C::Src::load(s, x)), ctx);
 }
 
-// Block kernels of each instruction set; n is a multiple of N. Explicitly instantiated per family.
+// Kernels of each instruction set, explicitly instantiated per family for every row. blocks: the block
+// form over n columns, n a multiple of N (rows with N > 1). wideRow: the one form of a row with N = 1
+// over a prefix of its width; returns the columns done.
 namespace sse41 {
 template <class C>
 void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx);
-}
+template <class C>
+int wideRow(const typename C::Src::Row& s, const typename C::Dst::Row& d, int width, const Ctx& ctx);
+} // namespace sse41
 namespace avx2 {
 template <class C>
 void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx);
-}
-namespace portable {
 template <class C>
-void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx)
-{
-    scalarBlocks<C>(s, d, n, ctx);
-}
-} // namespace portable
-
-// The flavour is chosen when building, never at run time.
-#if defined(ZOX_ISA_AVX2)
-namespace isa = avx2;
-#elif defined(ZOX_ISA_SSE41)
-namespace isa = sse41;
-#else
-namespace isa = portable;
-#endif
+int wideRow(const typename C::Src::Row& s, const typename C::Dst::Row& d, int width, const Ctx& ctx);
+} // namespace avx2
 
 template <class C>
 constexpr int blockColumns(int width)
@@ -77,15 +68,38 @@ constexpr int blockColumns(int width)
     return C::N > 1 ? width / C::N * C::N : 0;
 }
 
-template <class C>
+// One row through kernel set K: the set's block kernel below the width rounded down to N, or its
+// whole-row kernel over as many columns as it takes; the scalar remainder form from there on. Every
+// kernel is a fast path of a scalar form and gives its bytes.
+template <class C, KernelSet K>
 void convertRow(const typename C::Src::Row& s, const typename C::Dst::Row& d, int width, const Ctx& ctx)
 {
-    const int nb = blockColumns<C>(width);
-    if constexpr (C::N > 1)
-        if (nb > 0)
-            isa::blocks<C>(s, d, nb, ctx);
-    for (int x = nb; x < width; ++x)
+    int x = 0;
+    if constexpr (C::N > 1) {
+        x = blockColumns<C>(width);
+        if (x > 0) {
+            if constexpr (K == KernelSet::Avx2)
+                avx2::blocks<C>(s, d, x, ctx);
+            else if constexpr (K == KernelSet::Sse41)
+                sse41::blocks<C>(s, d, x, ctx);
+            else
+                scalarBlocks<C>(s, d, x, ctx);
+        }
+    } else if constexpr (K == KernelSet::Avx2) {
+        x = avx2::wideRow<C>(s, d, width, ctx);
+    } else if constexpr (K == KernelSet::Sse41) {
+        x = sse41::wideRow<C>(s, d, width, ctx);
+    }
+    for (; x < width; ++x)
         C::Dst::store(d, x, C::Rem::apply(C::Src::load(s, x)), ctx);
+}
+
+template <class C, KernelSet K>
+void convertRows(typename C::Src::Arg src, int srcStep, typename C::Dst::Arg dst, int dstStep, ImageSize roi,
+                 const Ctx& ctx)
+{
+    for (int r = 0; r < roi.height; ++r)
+        convertRow<C, K>(C::Src::row(src, srcStep, r), C::Dst::row(dst, dstStep, r), roi.width, ctx);
 }
 
 // The validating layer and row walk. Steps are taken as they come: any value walks rows at that distance.
@@ -105,8 +119,14 @@ zoxStatus convert(typename C::Src::Arg src, int srcStep, typename C::Dst::Arg ds
     if constexpr (C::checks == Checks::PointersSizesPlanes)
         if (!Src::planesValid(src) || !Dst::planesValid(dst))
             return zoxStatusNullPointer;
-    for (int r = 0; r < roi.height; ++r)
-        convertRow<C>(Src::row(src, srcStep, r), Dst::row(dst, dstStep, r), roi.width, ctx);
+    if constexpr (kChosenAtLoad) {
+        if (activeKernelSet() == KernelSet::Avx2)
+            convertRows<C, KernelSet::Avx2>(src, srcStep, dst, dstStep, roi, ctx);
+        else
+            convertRows<C, KernelSet::Sse41>(src, srcStep, dst, dstStep, roi, ctx);
+    } else {
+        convertRows<C, kBuiltKernelSet>(src, srcStep, dst, dstStep, roi, ctx);
+    }
     return zoxStatusOk;
 }
 
@@ -129,6 +149,14 @@ zoxStatus convert(typename C::Src::Arg src, int srcStep, typename C::Dst::Arg ds
         return ::zox::convert<::zox::Conv<Src, Dst, N, Block, Rem, Chk>>(src, srcStep, dst, dstStep,      \
                                                                           roiSize, ::zox::Ctx{alpha});     \
     }
+
+// Table expansion for a family's *_sse41.cpp and *_avx2.cpp: instantiates the block kernel and the
+// whole-row kernel of every row (one of the two is empty).
+#define ZOX_INSTANTIATE_KERNELS(name, shape, Src, Dst, N, Block, Rem, Chk)                                 \
+    template void blocks<::zox::Conv<Src, Dst, N, Block, Rem, Chk>>(const Src::Row&, const Dst::Row&, int,  \
+                                                                   const ::zox::Ctx&);                   \
+    template int wideRow<::zox::Conv<Src, Dst, N, Block, Rem, Chk>>(const Src::Row&, const Dst::Row&, int, \
+                                                                    const ::zox::Ctx&);
 
 // Table expansion for a family's exports: each row through its shape.
 #define ZOX_DEFINE_EXPORT(name, shape, Src, Dst, N, Block, Rem, Chk) shape(name, Src, Dst, N, Block, Rem, Chk)

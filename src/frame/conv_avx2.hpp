@@ -1,23 +1,33 @@
 // AVX2 side of the generic conversion: the generic readers and writers over 256-bit vectors (two lanes:
-// thirty-two pixels a turn, the second group of sixteen in the upper lane), and the block kernel that
-// runs a family's block form over sixteen 16-bit lanes. The shorter groups at the end of a run go
-// through the 128-bit readers and writers, their halves joined into one vector. Included only by
-// *_avx2.cpp files.
+// thirty-two pixels a turn, the second group of sixteen in the upper lane), the block kernel that runs
+// a family's block form over sixteen 16-bit lanes, and the whole-row kernel over eight 32-bit lanes.
+// The shorter groups at the end of a run go through 128-bit readers and writers of this set's own
+// (namespace `half`, compiled with this set's flags), their halves joined into one vector. Included
+// only by *_avx2.cpp files.
 #pragma once
 
-#include "frame/conv_sse41.hpp"
+#include "frame/conv.hpp"
 #include "frame/ops_avx2.hpp"
+
+#include <cstring>
+
+namespace zox::avx2::half {
+#include "frame/ops128.inl"
+#include "frame/io_simd.inl"
+#include "frame/conv128.inl"
+} // namespace zox::avx2::half
 
 namespace zox::avx2 {
 
 #include "frame/io_simd.inl"
+#include "frame/wide_simd.inl"
 
 inline V join(__m128i lo, __m128i hi)
 {
     return _mm256_inserti128_si256(_mm256_castsi128_si256(lo), hi, 1);
 }
 
-inline V3 join(const sse41::V3& lo, const sse41::V3& hi)
+inline V3 join(const half::V3& lo, const half::V3& hi)
 {
     return {{join(lo.c[0], hi.c[0]), join(lo.c[1], hi.c[1]), join(lo.c[2], hi.c[2])}, join(lo.extra, hi.extra)};
 }
@@ -32,7 +42,7 @@ inline __m128i upper(V v)
 }
 
 // Written out channel by channel: a loop here goes through memory.
-inline void split(const V3& v, sse41::V3& lo, sse41::V3& hi)
+inline void split(const V3& v, half::V3& lo, half::V3& hi)
 {
     lo = {{lower(v.c[0]), lower(v.c[1]), lower(v.c[2])}, lower(v.extra)};
     hi = {{upper(v.c[0]), upper(v.c[1]), upper(v.c[2])}, upper(v.extra)};
@@ -47,29 +57,24 @@ void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n,
         constexpr int shift = inputShift<typename C::Block>;
         int x = wholeGroups<C>(s, d, n, ctx);
         if (x + 16 <= n) {
-            sse41::V3 a, b;
-            sse41::GroupIo<typename C::Src>::template get<shift>(s, x, a, b);
+            half::V3 a, b;
+            half::GroupIo<typename C::Src>::template get<shift>(s, x, a, b);
             V3 v = join(a, b);
             F::apply(v);
             split(v, a, b);
-            sse41::GroupIo<typename C::Dst>::put(d, x, a, b, ctx);
+            half::GroupIo<typename C::Dst>::put(d, x, a, b, ctx);
             x += 16;
         }
         // Eight pixels, or four staged: the upper half of the vector repeats the lower one.
         auto run8 = [&](const typename C::Src::Row& s8, const typename C::Dst::Row& d8, int at) {
-            sse41::V3 a = sse41::Io8<typename C::Src>::template get<shift>(s8, at), b;
+            half::V3 a = half::Io8<typename C::Src>::template get<shift>(s8, at), b;
             V3 v = join(a, a);
             F::apply(v);
             split(v, a, b);
-            sse41::Io8<typename C::Dst>::put(d8, at, a, ctx);
+            half::Io8<typename C::Dst>::put(d8, at, a, ctx);
         };
-        sse41::eightThenStaged<C>(s, d, x, n, run8);
+        half::eightThenStaged<C>(s, d, x, n, run8);
     }
 }
 
 } // namespace zox::avx2
-
-// Table expansion for a family's *_avx2.cpp: instantiates the block kernel of every row.
-#define ZOX_AVX2_INSTANTIATE(name, shape, Src, Dst, N, Block, Rem, Chk)                                  \
-    template void blocks<::zox::Conv<Src, Dst, N, Block, Rem, Chk>>(const Src::Row&, const Dst::Row&, int, \
-                                                                   const ::zox::Ctx&);

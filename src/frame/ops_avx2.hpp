@@ -63,4 +63,43 @@ inline void storeLanes(uint8_t* q, std::size_t g, V v)
         _mm256_storeu2_m128i(reinterpret_cast<__m128i*>(q + g), reinterpret_cast<__m128i*>(q), v);
 }
 
+// 32-bit lanes, for the whole-row forms whose products need more than 16 bits: eight lanes.
+inline constexpr int kWideLanes = 8;
+template <int K>
+struct Lanes32 {
+    alignas(32) static constexpr int32_t v[8] = {K, K, K, K, K, K, K, K};
+};
+template <int K>
+inline V splat32()
+{
+    return _mm256_load_si256(reinterpret_cast<const V*>(Lanes32<K>::v));
+}
+inline V add32(V a, V b) { return _mm256_add_epi32(a, b); }
+inline V sub32(V a, V b) { return _mm256_sub_epi32(a, b); }
+inline V mul32(V a, V b) { return _mm256_mullo_epi32(a, b); }
+template <int S> inline V shl32(V a) { return _mm256_slli_epi32(a, S); }
+template <int S> inline V shr32(V a) { return _mm256_srai_epi32(a, S); }
+template <int S> inline V shrU32(V a) { return _mm256_srli_epi32(a, S); }
+inline V and_(V a, V b) { return _mm256_and_si256(a, b); }
+// Within each 128-bit lane, as the 128-bit set: pixels 0..3 stay in the lower lane, 4..7 in the upper.
+inline V packs32(V a, V b) { return _mm256_packs_epi32(a, b); }
+inline V loadWidePixels4(const uint8_t* q) { return _mm256_loadu_si256(reinterpret_cast<const V*>(q)); }
+inline V loadWideBytes(const uint8_t* q) { return _mm256_cvtepu8_epi32(_mm_loadl_epi64(reinterpret_cast<const __m128i*>(q))); }
+inline void storeWideBytes(uint8_t* q, V v)
+{
+    const V p = packs32(v, v);
+    const V b = packUs(p, p); // bytes 0..3 of each 128-bit lane: lanes 0..3, 4..7
+    const __m128i lo = _mm256_castsi256_si128(b), hi = _mm256_extracti128_si256(b, 1);
+    _mm_storel_epi64(reinterpret_cast<__m128i*>(q), _mm_unpacklo_epi32(lo, hi));
+}
+template <class F>
+inline void forEachPair(V v, F&& f)
+{
+    const __m128i lo = _mm256_castsi256_si128(v), hi = _mm256_extracti128_si256(v, 1);
+    f(0, static_cast<uint64_t>(_mm_cvtsi128_si64(lo)));
+    f(1, static_cast<uint64_t>(_mm_extract_epi64(lo, 1)));
+    f(2, static_cast<uint64_t>(_mm_cvtsi128_si64(hi)));
+    f(3, static_cast<uint64_t>(_mm_extract_epi64(hi, 1)));
+}
+
 } // namespace zox::avx2

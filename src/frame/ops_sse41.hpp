@@ -1,4 +1,4 @@
-// The fixed-point vocabulary over 128-bit vectors of eight 16-bit lanes (SSE4.1 files only).
+// The SSE4.1 vocabulary: 128-bit vectors (SSE4.1 files only).
 #pragma once
 
 #include "frame/shuffle_masks.hpp"
@@ -9,68 +9,5 @@
 #include <cstdint>
 
 namespace zox::sse41 {
-
-using V = __m128i;
-
-// A constant in every lane; the constant is a template argument so that it can live in constant data.
-template <int K>
-inline V splat16()
-{
-    return _mm_set1_epi16(static_cast<short>(K));
-}
-inline V splat16(int k) { return _mm_set1_epi16(static_cast<short>(k)); }
-inline V mulHigh(V a, V k) { return _mm_mulhi_epi16(a, k); }
-inline V mulHighU(V a, V k) { return _mm_mulhi_epu16(a, k); }
-// pmulhrsw is exactly floor((a k + 16384) / 32768).
-inline V mulRound(V a, V k) { return _mm_mulhrs_epi16(a, k); }
-inline V add(V a, V b) { return _mm_add_epi16(a, b); }
-inline V sub(V a, V b) { return _mm_sub_epi16(a, b); }
-template <int S> inline V shl(V a) { return _mm_slli_epi16(a, S); }
-template <int S> inline V shr(V a) { return _mm_srai_epi16(a, S); }   // arithmetic: floor division
-template <int S> inline V shrU(V a) { return _mm_srli_epi16(a, S); }  // logical
-// Eight 16-bit lanes of a and eight of b to sixteen bytes, each limited to 0..255: clip8.
-inline V packUs(V a, V b) { return _mm_packus_epi16(a, b); }
-
-// Shuffle mask from sixteen byte indices (-1 gives a zero byte).
-constexpr uint64_t maskHalf(const int (&idx)[16], int from)
-{
-    uint64_t m = 0;
-    for (int i = 7; i >= 0; --i)
-        m = (m << 8) | static_cast<uint8_t>(idx[from + i] < 0 ? 0x80 : idx[from + i]);
-    return m;
-}
-inline V shuffleMask(const int (&idx)[16])
-{
-    return _mm_set_epi64x(static_cast<long long>(maskHalf(idx, 8)), static_cast<long long>(maskHalf(idx, 0)));
-}
-
-inline V load16(const uint8_t* p) { return _mm_loadu_si128(reinterpret_cast<const V*>(p)); }
-inline V load8(const uint8_t* p) { return _mm_loadl_epi64(reinterpret_cast<const V*>(p)); }
-inline V load4(const uint8_t* p)
-{
-    int32_t v;
-    __builtin_memcpy(&v, p, 4);
-    return _mm_cvtsi32_si128(v);
-}
-inline void store16(uint8_t* p, V v) { _mm_storeu_si128(reinterpret_cast<V*>(p), v); }
-inline void store8(uint8_t* p, V v) { _mm_storel_epi64(reinterpret_cast<V*>(p), v); }
-inline void store4(uint8_t* p, V v)
-{
-    const int32_t x = _mm_cvtsi128_si32(v);
-    __builtin_memcpy(p, &x, 4);
-}
-
-// The rest of the vocabulary of the generic readers and writers: one lane of sixteen pixels.
-inline constexpr int kGroupPixels = 16;
-inline V zero() { return _mm_setzero_si128(); }
-inline V maskOf(const Bytes16& m) { return _mm_load_si128(reinterpret_cast<const V*>(m.b)); }
-inline V shuffle(V a, V m) { return _mm_shuffle_epi8(a, m); }
-inline V or_(V a, V b) { return _mm_or_si128(a, b); }
-inline V unpackLo8(V a, V b) { return _mm_unpacklo_epi8(a, b); }
-inline V unpackHi8(V a, V b) { return _mm_unpackhi_epi8(a, b); }
-inline V unpackLo16(V a, V b) { return _mm_unpacklo_epi16(a, b); }
-inline V unpackHi16(V a, V b) { return _mm_unpackhi_epi16(a, b); }
-inline V loadLanes(const uint8_t* q, std::size_t) { return load16(q); }
-inline void storeLanes(uint8_t* q, std::size_t, V v) { store16(q, v); }
-
+#include "frame/ops128.inl"
 } // namespace zox::sse41

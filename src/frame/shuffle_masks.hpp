@@ -43,3 +43,24 @@ template <int Bpp, int Base, int Slot, int At>
 inline constexpr Bytes16 kScatter = scatterMask(Bpp, Base, Slot, At);
 
 } // namespace zox
+
+namespace zox {
+
+// Pixel dwords from a register that holds channel k of pixels 0..3 at bytes 4k..4k+3: byte slot[k] of
+// pixel i takes byte 4k + i, the fourth byte of each pixel is zero.
+constexpr Bytes16 pixelDwordMask(int slot0, int slot1, int slot2)
+{
+    Bytes16 m{};
+    for (int j = 0; j < 16; ++j)
+        m.b[j] = -1;
+    const int slot[3] = {slot0, slot1, slot2};
+    for (int i = 0; i < 4; ++i)
+        for (int k = 0; k < 3; ++k)
+            m.b[4 * i + slot[k]] = static_cast<int8_t>(4 * k + i);
+    return m;
+}
+
+template <int Slot0, int Slot1, int Slot2>
+inline constexpr Bytes16 kPixelDwords = pixelDwordMask(Slot0, Slot1, Slot2);
+
+} // namespace zox

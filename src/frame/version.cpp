@@ -1,6 +1,13 @@
-// The version record, and the one call made to the core services when the library loads.
+// The version record, and the one call made to the core services when the library loads: the feature
+// word that chooses the kernel set of a build holding more than one.
+#include "frame/kernel_set.hpp"
 #include "zoxcc.h"
 #include "zoxcore.h"
+
+namespace zox {
+// The baseline until the load-time hook has run.
+KernelSet gLoadedKernelSet = KernelSet::Sse41;
+} // namespace zox
 
 namespace {
 
@@ -11,10 +18,10 @@ constexpr const char* kBuildDate = "Oct  9 2014";
 constexpr LibraryVersion kPlain{8, 2, 1, 44077, {'p', '8', 0, 0}, "zoxCC SSE4.1/4.2 (p8)", kVersionText, kBuildDate};
 constexpr LibraryVersion kPlus{8, 2, 1, 44077, {'p', '8', 0, 0}, "zoxCC SSE4.1/4.2 (p8)+", kVersionText, kBuildDate};
 
-// The feature word is asked for once while the library loads; no conversion depends on the answer.
-[[gnu::constructor]] void askFeaturesOnLoad()
+// The feature word is asked for once while the library loads; no call asks again.
+[[gnu::constructor]] void chooseKernelsOnLoad()
 {
-    static_cast<void>(zoxGetEnabledCpuFeatures());
+    zox::gLoadedKernelSet = zox::kernelSetFor(zoxGetEnabledCpuFeatures());
 }
 
 } // namespace

@@ -5,5 +5,5 @@
 namespace zox::avx2 {
 #include "lumachroma/ycbcr_simd.inl"
 
-ZOX_YCBCR_TABLE(ZOX_AVX2_INSTANTIATE)
+ZOX_YCBCR_TABLE(ZOX_INSTANTIATE_KERNELS)
 } // namespace zox::avx2

@@ -60,3 +60,33 @@ struct Simd<RgbFromYccBlock<K, Rd, G>> {
         v.c[2] = shr<4>(add(luma, mulHigh(a, splat16<K.uB>())));
     }
 };
+
+// ---- whole-row forms over 32-bit lanes ----------------------------------------------------------------
+
+template <>
+struct Wide<YccFromRgbPixel> {
+    static constexpr const YccForwardGains& K = YccForward;
+    static void apply(W3& w)
+    {
+        const V r = w.c[0], g = w.c[1], b = w.c[2];
+        auto sum = [&]<int kr, int kg, int kb, int offset>() {
+            const V s = add32(add32(mul32(r, splat32<kr>()), mul32(g, splat32<kg>())), mul32(b, splat32<kb>()));
+            return add32(shr32<16>(add32(s, splat32<32768>())), splat32<offset>());
+        };
+        w.c[0] = sum.template operator()<K.yR, K.yG, K.yB, 16>();
+        w.c[1] = sum.template operator()<K.cbR, K.cbG, K.cbB, 128>();
+        w.c[2] = sum.template operator()<K.crR, K.crG, K.crB, 128>();
+    }
+};
+
+template <const YccInverseGains& K, int R>
+struct Wide<RgbFromYccPixel<K, R>> {
+    static void apply(W3& w)
+    {
+        const V y = mul32(sub32(w.c[0], splat32<16>()), splat32<K.y>());
+        const V u = sub32(w.c[1], splat32<128>()), v = sub32(w.c[2], splat32<128>());
+        w.c[0] = shr32<16>(add32(add32(y, mul32(v, splat32<K.vR>())), splat32<R>()));
+        w.c[1] = shr32<16>(add32(add32(add32(y, mul32(u, splat32<K.uG>())), mul32(v, splat32<K.vG>())), splat32<R>()));
+        w.c[2] = shr32<16>(add32(add32(y, mul32(u, splat32<K.uB>())), splat32<R>()));
+    }
+};

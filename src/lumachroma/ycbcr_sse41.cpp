@@ -5,5 +5,5 @@
 namespace zox::sse41 {
 #include "lumachroma/ycbcr_simd.inl"
 
-ZOX_YCBCR_TABLE(ZOX_SSE41_INSTANTIATE)
+ZOX_YCBCR_TABLE(ZOX_INSTANTIATE_KERNELS)
 } // namespace zox::sse41

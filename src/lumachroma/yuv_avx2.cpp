@@ -5,5 +5,5 @@
 namespace zox::avx2 {
 #include "lumachroma/yuv_simd.inl"
 
-ZOX_YUV_TABLE(ZOX_AVX2_INSTANTIATE)
+ZOX_YUV_TABLE(ZOX_INSTANTIATE_KERNELS)
 } // namespace zox::avx2

@@ -76,3 +76,33 @@ struct Simd<RgbFromYuvBlock128> {
         v.c[2] = shr<3>(add(y8, mulHigh(a, splat16<K.uB>())));
     }
 };
+
+// ---- whole-row forms over 32-bit lanes ----------------------------------------------------------------
+
+template <bool FullRound>
+struct Wide<YuvFromRgbDifference<FullRound>> {
+    using K = YuvDifferenceForward;
+    static void apply(W3& w)
+    {
+        const V r = w.c[0], g = w.c[1], b = w.c[2];
+        const V t = add32(add32(mul32(r, splat32<K::yR>()), mul32(g, splat32<K::yG>())), mul32(b, splat32<K::yB>()));
+        const V dBias = splat32<FullRound ? 32768 : 32767>();
+        const V dB = shr32<16>(add32(sub32(shl32<16>(b), t), dBias));
+        const V dR = shr32<16>(add32(sub32(shl32<16>(r), t), dBias));
+        w.c[0] = shr32<16>(FullRound ? add32(t, splat32<32768>()) : t);
+        w.c[1] = add32(shr32<16>(mul32(dB, splat32<K::uGain>())), splat32<128>());
+        w.c[2] = add32(shr32<16>(mul32(dR, splat32<K::vGain>())), splat32<128>());
+    }
+};
+
+template <const YuvInverseGains& K, int RB, int G>
+struct Wide<RgbFromYuvPixel<K, RB, G>> {
+    static void apply(W3& w)
+    {
+        const V y = shl32<16>(w.c[0]);
+        const V u = sub32(w.c[1], splat32<128>()), v = sub32(w.c[2], splat32<128>());
+        w.c[0] = shr32<16>(add32(add32(y, mul32(v, splat32<K.vR>())), splat32<RB>()));
+        w.c[1] = shr32<16>(add32(add32(add32(y, mul32(u, splat32<K.uG>())), mul32(v, splat32<K.vG>())), splat32<G>()));
+        w.c[2] = shr32<16>(add32(add32(y, mul32(u, splat32<K.uB>())), splat32<RB>()));
+    }
+};

@@ -5,5 +5,5 @@
 namespace zox::sse41 {
 #include "lumachroma/yuv_simd.inl"
 
-ZOX_YUV_TABLE(ZOX_SSE41_INSTANTIATE)
+ZOX_YUV_TABLE(ZOX_INSTANTIATE_KERNELS)
 } // namespace zox::sse41

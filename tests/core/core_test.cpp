@@ -1,4 +1,5 @@
 // The real core services.
+#include "core/cpu_features.hpp"
 #include "zoxcore.h"
 
 #include <gtest/gtest.h>
@@ -47,4 +48,31 @@ TEST(Core, ManyThreads)
         });
     for (auto& t : threads)
         t.join();
+}
+
+// The decoding of the feature registers, on made-up values: a vector extension counts only with the
+// operating system saving its state.
+TEST(Core, FeatureWordFromRegisters)
+{
+    using zox::core::CpuidWords;
+    const uint32_t sse = bit_SSE3 | bit_SSSE3 | bit_SSE4_1 | bit_SSE4_2 | bit_POPCNT;
+    const uint32_t avx = sse | bit_OSXSAVE | bit_AVX;
+    const uint64_t baseline = zoxCpuSse2 | zoxCpuSse3 | zoxCpuSsse3 | zoxCpuSse41 | zoxCpuSse42 | zoxCpuPopcnt;
+    struct Row {
+        const char* what;
+        CpuidWords w;
+        uint64_t want;
+    } rows[] = {
+        {"nothing", {}, 0},
+        {"SSE4.2 machine", {sse, bit_SSE2, 0, 0}, baseline},
+        {"AVX2, OS saves YMM", {avx, bit_SSE2, bit_AVX2, 0x7}, baseline | zoxCpuAvx | zoxCpuAvx2},
+        {"AVX2, OS saves XMM only", {avx, bit_SSE2, bit_AVX2, 0x3}, baseline},
+        {"AVX2 without OSXSAVE", {avx & ~bit_OSXSAVE, bit_SSE2, bit_AVX2, 0x7}, baseline},
+        {"AVX2 bit without AVX", {avx & ~bit_AVX, bit_SSE2, bit_AVX2, 0x7}, baseline},
+        {"AVX-512F, no ZMM state", {avx, bit_SSE2, bit_AVX2 | bit_AVX512F, 0x7}, baseline | zoxCpuAvx | zoxCpuAvx2},
+        {"AVX-512F, ZMM state", {avx, bit_SSE2, bit_AVX2 | bit_AVX512F, 0xE7}, baseline | zoxCpuAvx | zoxCpuAvx2 | zoxCpuAvx512f},
+    };
+    for (const Row& r : rows)
+        EXPECT_EQ(zox::core::featureWordOf(r.w), r.want) << r.what;
+    EXPECT_EQ(zox::core::featureWordOf(zox::core::readCpuidWords()), zoxGetEnabledCpuFeatures());
 }

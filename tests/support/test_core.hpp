@@ -1,5 +1,6 @@
 // The test build of the core services: linked into the test program in place of libzoxcore, it counts
-// allocations and can be told to fail them or to change the feature answer.
+// allocations and can be told to fail them or to change the answer of ownGetFeature(128, 0); the feature
+// word is the processor's own, so that the library chooses its kernels as it would with the real ones.
 #pragma once
 
 #include <atomic>
