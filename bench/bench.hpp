@@ -1,5 +1,6 @@
 // Benchmark registration: every case at 1920x1080 and 64x64, reporting bytes of input plus output per
-// second, with a memcpy of as many bytes registered once per byte count as the baseline.
+// second. Registrations are held until the filter is known: a selected case always runs with the memcpy
+// of as many bytes and with the calls of other libraries timed beside it.
 #pragma once
 
 #include <benchmark/benchmark.h>
@@ -21,12 +22,13 @@ inline constexpr Size kSizes[] = {{1920, 1080}, {64, 64}};
 // A prepared call: owns its buffers, runs the conversion once per invocation.
 using Call = std::function<void()>;
 
-// Registers `name` at `size`, moving `bytes` bytes of input plus output per call, and the memcpy of
-// `bytes` bytes beside it. `prepare` builds the buffers once, outside the timing loop.
+// Registers `name` at `size` (as "<name>/<W>x<H>"), moving `bytes` bytes of input plus output per call.
+// `prepare` builds the buffers once, outside the timing loop.
 void registerCase(const std::string& name, Size size, std::size_t bytes, std::function<Call(Size)> prepare);
 
-// Registers a comparison call of another library, reported as a ratio to `ours`.
-void registerPeer(const std::string& name, const std::string& ours, Size size, std::size_t bytes,
+// Registers a call of another library (as "peer:<name>/<W>x<H>"), timed and reported beside each of
+// our cases named in `ours` at the same size.
+void registerPeer(const std::string& name, const std::vector<std::string>& ours, Size size, std::size_t bytes,
                   std::function<Call(Size)> prepare);
 
 // Seeded bytes for benchmark images.

@@ -1,13 +1,15 @@
 // The one list of what the benchmark program registers.
 namespace zb {
 void registerConvFamilies();
-void registerPeers();
 void registerGammaFamily();
+void registerLibyuvPeers();
+void registerOpenCVPeers();
 
 void registerAll()
 {
     registerConvFamilies();
     registerGammaFamily();
-    registerPeers();
+    registerLibyuvPeers();
+    registerOpenCVPeers();
 }
 } // namespace zb
