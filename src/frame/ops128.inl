@@ -81,19 +81,49 @@ template <int S> inline V shr32(V a) { return _mm_srai_epi32(a, S); } // arithme
 template <int S> inline V shrU32(V a) { return _mm_srli_epi32(a, S); }
 inline V and_(V a, V b) { return _mm_and_si128(a, b); }
 inline V packs32(V a, V b) { return _mm_packs_epi32(a, b); } // to 16 bits, saturating
-// The pixels of one wide turn: a 16-byte row of four 4-byte pixels, or four bytes of a plane widened.
+// Four-byte pixels, one a lane: four of them.
 inline V loadWidePixels4(const uint8_t* q) { return load16(q); }
-inline V loadWideBytes(const uint8_t* q) { return _mm_cvtepu8_epi32(load4(q)); }
-// Lanes 0..3 limited to 0..255 (clip8) as four bytes at q.
-inline void storeWideBytes(uint8_t* q, V v)
+// Bytes of a plane widened to 32-bit lanes, and 32-bit lanes limited to 0..255 (clip8) back to bytes,
+// in pixel order: M = 1 moves kWideLanes bytes, M = 4 four times as many.
+template <int M>
+inline void widenBytes(const uint8_t* q, V (&v)[M])
 {
-    const V p = packs32(v, v);
-    store4(q, packUs(p, p));
+    if constexpr (M == 1) {
+        v[0] = _mm_cvtepu8_epi32(load4(q));
+    } else {
+        static_assert(M == 4);
+        const V x = load16(q);
+        v[0] = _mm_cvtepu8_epi32(x);
+        v[1] = _mm_cvtepu8_epi32(_mm_srli_si128(x, 4));
+        v[2] = _mm_cvtepu8_epi32(_mm_srli_si128(x, 8));
+        v[3] = _mm_cvtepu8_epi32(_mm_srli_si128(x, 12));
+    }
 }
-// The 64-bit halves of a vector: two pixels of 32-bit lanes each.
+template <int M>
+inline void narrowBytes(uint8_t* q, const V (&v)[M])
+{
+    if constexpr (M == 1) {
+        const V p = packs32(v[0], v[0]);
+        store4(q, packUs(p, p));
+    } else {
+        static_assert(M == 4);
+        store16(q, packUs(packs32(v[0], v[1]), packs32(v[2], v[3])));
+    }
+}
+// The 128-bit halves of a vector, in address order.
 template <class F>
-inline void forEachPair(V v, F&& f)
+inline void forEachHalf(V v, F&& f)
 {
-    f(0, static_cast<uint64_t>(_mm_cvtsi128_si64(v)));
-    f(1, static_cast<uint64_t>(_mm_extract_epi64(v, 1)));
+    f(0, v);
 }
+
+// Bytes: the lookup of byte tables.
+template <int K>
+inline V splat8()
+{
+    return _mm_set1_epi8(static_cast<char>(K));
+}
+inline V sub8(V a, V b) { return _mm_sub_epi8(a, b); }
+inline V xor_(V a, V b) { return _mm_xor_si128(a, b); }
+// The bytes of b where the byte of m has its top bit set, else those of a.
+inline V selectByTopBit(V a, V b, V m) { return _mm_blendv_epi8(a, b, m); }

@@ -84,22 +84,51 @@ inline V and_(V a, V b) { return _mm256_and_si256(a, b); }
 // Within each 128-bit lane, as the 128-bit set: pixels 0..3 stay in the lower lane, 4..7 in the upper.
 inline V packs32(V a, V b) { return _mm256_packs_epi32(a, b); }
 inline V loadWidePixels4(const uint8_t* q) { return _mm256_loadu_si256(reinterpret_cast<const V*>(q)); }
-inline V loadWideBytes(const uint8_t* q) { return _mm256_cvtepu8_epi32(_mm_loadl_epi64(reinterpret_cast<const __m128i*>(q))); }
-inline void storeWideBytes(uint8_t* q, V v)
+template <int M>
+inline void widenBytes(const uint8_t* q, V (&v)[M])
 {
-    const V p = packs32(v, v);
-    const V b = packUs(p, p); // bytes 0..3 of each 128-bit lane: lanes 0..3, 4..7
-    const __m128i lo = _mm256_castsi256_si128(b), hi = _mm256_extracti128_si256(b, 1);
-    _mm_storel_epi64(reinterpret_cast<__m128i*>(q), _mm_unpacklo_epi32(lo, hi));
+    if constexpr (M == 1) {
+        v[0] = _mm256_cvtepu8_epi32(_mm_loadl_epi64(reinterpret_cast<const __m128i*>(q)));
+    } else {
+        static_assert(M == 4);
+        const __m128i lo = _mm_loadu_si128(reinterpret_cast<const __m128i*>(q));
+        const __m128i hi = _mm_loadu_si128(reinterpret_cast<const __m128i*>(q + 16));
+        v[0] = _mm256_cvtepu8_epi32(lo);
+        v[1] = _mm256_cvtepu8_epi32(_mm_srli_si128(lo, 8));
+        v[2] = _mm256_cvtepu8_epi32(hi);
+        v[3] = _mm256_cvtepu8_epi32(_mm_srli_si128(hi, 8));
+    }
+}
+// The saturating packs work within 128-bit lanes; a dword permutation puts the bytes in pixel order.
+template <int M>
+inline void narrowBytes(uint8_t* q, const V (&v)[M])
+{
+    if constexpr (M == 1) {
+        const V p = packs32(v[0], v[0]);
+        const V b = packUs(p, p); // bytes 0..3 of each 128-bit lane: lanes 0..3, 4..7
+        const __m128i lo = _mm256_castsi256_si128(b), hi = _mm256_extracti128_si256(b, 1);
+        _mm_storel_epi64(reinterpret_cast<__m128i*>(q), _mm_unpacklo_epi32(lo, hi));
+    } else {
+        static_assert(M == 4);
+        const V b = packUs(packs32(v[0], v[1]), packs32(v[2], v[3])); // dwords: pixels 0, 8, 16, 24 | 4, 12, 20, 28
+        _mm256_storeu_si256(reinterpret_cast<V*>(q), _mm256_permutevar8x32_epi32(b, _mm256_setr_epi32(0, 4, 1, 5, 2, 6, 3, 7)));
+    }
 }
 template <class F>
-inline void forEachPair(V v, F&& f)
+inline void forEachHalf(V v, F&& f)
 {
-    const __m128i lo = _mm256_castsi256_si128(v), hi = _mm256_extracti128_si256(v, 1);
-    f(0, static_cast<uint64_t>(_mm_cvtsi128_si64(lo)));
-    f(1, static_cast<uint64_t>(_mm_extract_epi64(lo, 1)));
-    f(2, static_cast<uint64_t>(_mm_cvtsi128_si64(hi)));
-    f(3, static_cast<uint64_t>(_mm_extract_epi64(hi, 1)));
+    f(0, _mm256_castsi256_si128(v));
+    f(1, _mm256_extracti128_si256(v, 1));
 }
+
+// Bytes: the lookup of byte tables.
+template <int K>
+inline V splat8()
+{
+    return _mm256_set1_epi8(static_cast<char>(K));
+}
+inline V sub8(V a, V b) { return _mm256_sub_epi8(a, b); }
+inline V xor_(V a, V b) { return _mm256_xor_si256(a, b); }
+inline V selectByTopBit(V a, V b, V m) { return _mm256_blendv_epi8(a, b, m); }
 
 } // namespace zox::avx2

@@ -4,6 +4,7 @@
 // range at 32f.
 #pragma once
 
+#include "frame/byte_table.hpp"
 #include "frame/layouts.hpp"
 #include "pointops/gamma_forms.hpp"
 #include "zoxcc.h"
@@ -50,6 +51,11 @@ inline void freeUnits(void* p)
 // How one call maps a sample, once prepared.
 template <class T, gamma::Dir D>
 struct GammaMap;
+
+// The 8u tables in the form of the byte-shuffle lookup.
+template <gamma::Dir D>
+inline constexpr ShuffleTable kGammaShuffled8u =
+    shuffleTableOf(D == gamma::Dir::Fwd ? gamma::kGammaFwd8u : gamma::kGammaInv8u);
 
 template <gamma::Dir D>
 struct GammaMap<uint8_t, D> {
@@ -114,6 +120,13 @@ void mapSamples(const Map& map, const T* s, T* d, std::size_t n)
 #pragma GCC unroll 8
     for (std::size_t i = 0; i < n; ++i)
         d[i] = map(s[i]);
+}
+
+// Contiguous 8u samples through the table by byte shuffles, where the kernel set has them.
+template <gamma::Dir D>
+void mapSamples(const GammaMap<uint8_t, D>& map, const uint8_t* s, uint8_t* d, std::size_t n)
+{
+    lookupBytes(s, d, n, map.table, kGammaShuffled8u<D>);
 }
 
 // Stand-in for a null plane array, so that the walk can index it; the null itself is reported first.

@@ -1,6 +1,8 @@
 // The kernel set a build runs: the choice made at load, and the separation of the sets' code.
 #include "core/cpu_features.hpp"
+#include "frame/byte_table.hpp"
 #include "frame/kernel_set.hpp"
+#include "support/conv_sweep.hpp"
 
 #include <gtest/gtest.h>
 
@@ -72,4 +74,34 @@ TEST(KernelSets, Avx2CodeStaysInItsNamespace)
     }
     pclose(pipe);
     EXPECT_GT(avx2Functions, 0);
+}
+
+// The byte-shuffle lookup of every kernel set the processor runs against the table itself: every byte
+// value at every position of the vector, runs of 0..100 bytes from each of 32 offsets, in place too.
+TEST(KernelSets, ByteTableLookup)
+{
+    uint8_t table[256];
+    for (int i = 0; i < 256; ++i)
+        table[i] = static_cast<uint8_t>((i * 167 + 13) ^ (i >> 3));
+    const zox::ShuffleTable shuffled = zox::shuffleTableOf(table);
+    zt::Rng rng(5);
+    std::vector<uint8_t> src(256 + 32 + 100), want, got;
+    for (std::size_t i = 0; i < src.size(); ++i)
+        src[i] = static_cast<uint8_t>(i < 256 ? i : rng());
+    for (KernelSet k : zt::runnableKernelSets())
+        for (int offset = 0; offset < 32; ++offset)
+            for (int n : {0, 1, 15, 16, 17, 31, 32, 33, 63, 64, 65, 100, 256}) {
+                const uint8_t* s = src.data() + (n == 256 ? 0 : offset);
+                want.assign(n, 0);
+                for (int i = 0; i < n; ++i)
+                    want[i] = table[s[i]];
+                got.assign(s, s + n);
+                if constexpr (zox::kHaveAvx2)
+                    if (k == KernelSet::Avx2)
+                        zox::lookupBytesWith<KernelSet::Avx2>(got.data(), got.data(), n, table, shuffled);
+                if constexpr (zox::kHaveSse41)
+                    if (k == KernelSet::Sse41)
+                        zox::lookupBytesWith<KernelSet::Sse41>(got.data(), got.data(), n, table, shuffled);
+                ASSERT_EQ(got, want) << zox::kernelSetName(k) << " offset " << offset << " n " << n;
+            }
 }
