@@ -23,6 +23,7 @@ struct Io8<InPlanar<P>> {
     {
         using G = GroupIo<InPlanar<P>>;
         V3 v;
+        #pragma GCC unroll 3
         for (int k = 0; k < 3; ++k)
             v.c[k] = G::template widenLo<Shift>(load8(row.p[k] + x));
         v.extra = P == 4 ? G::template widenLo<0>(load8(row.p[3] + x)) : zero();
@@ -58,6 +59,7 @@ template <int P>
 struct Io8<OutPlanar<P>> {
     static void put(const typename OutPlanar<P>::Row& row, int x, const V3& v, const Ctx&)
     {
+        #pragma GCC unroll 3
         for (int k = 0; k < 3; ++k)
             store8(row.p[k] + x, packUs(v.c[k], v.c[k]));
         if constexpr (P == 4)

@@ -80,6 +80,7 @@ struct GroupIo<InPlanar<P>> {
     template <int Shift>
     static void get(const typename InPlanar<P>::Row& row, int x, V3& a, V3& b)
     {
+        #pragma GCC unroll 3
         for (int k = 0; k < 3; ++k) {
             const V r = loadLanes(row.p[k] + x, 16);
             a.c[k] = widenLo<Shift>(r);
@@ -114,6 +115,7 @@ struct GroupIo<OutPacked<Bpp, O, F>> {
         constexpr std::size_t g = 16 * Bpp;
         uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * Bpp;
         V ch[3];
+        #pragma GCC unroll 3
         for (int k = 0; k < 3; ++k)
             ch[k] = packUs(a.c[channelByte(O, k)], b.c[channelByte(O, k)]); // ch[slot]: bytes of that slot
         if constexpr (Bpp == 3) {
@@ -140,6 +142,7 @@ template <int P>
 struct GroupIo<OutPlanar<P>> {
     static void put(const typename OutPlanar<P>::Row& row, int x, const V3& a, const V3& b, const Ctx&)
     {
+        #pragma GCC unroll 3
         for (int k = 0; k < 3; ++k)
             storeLanes(row.p[k] + x, 16, packUs(a.c[k], b.c[k]));
         if constexpr (P == 4)
@@ -148,10 +151,15 @@ struct GroupIo<OutPlanar<P>> {
 };
 
 // The whole groups of a run of n block pixels; returns the pixels done, the rest being fewer than a group.
+// The rows and the call's values are copied first: the stores cannot change the copies, so they stay in
+// registers.
 template <class C>
-int wholeGroups(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx)
+int wholeGroups(const typename C::Src::Row& sRow, const typename C::Dst::Row& dRow, int n, const Ctx& ctxIn)
 {
     using F = Simd<typename C::Block>;
+    const typename C::Src::Row s = sRow;
+    const typename C::Dst::Row d = dRow;
+    const Ctx ctx = ctxIn;
     int x = 0;
     for (; x + kGroupPixels <= n; x += kGroupPixels) {
         V3 a, b;

@@ -27,6 +27,7 @@ struct WideIo<InPacked<4, O>> {
     static void get(const typename InPacked<4, O>::Row& row, int x, W3 (&w)[M])
     {
         const V low = splat32<255>();
+        #pragma GCC unroll 4
         for (int m = 0; m < M; ++m) {
             const V p = loadWidePixels4(row.p[0] + (static_cast<std::size_t>(x) + m * kWideLanes) * 4);
             w[m].c[0] = and_(shrU32<8 * channelByte(O, 0)>(p), low);
@@ -41,9 +42,11 @@ struct WideIo<InPlanar<P>> {
     template <int M>
     static void get(const typename InPlanar<P>::Row& row, int x, W3 (&w)[M])
     {
+        #pragma GCC unroll 3
         for (int k = 0; k < 3; ++k) {
             V v[M];
             widenBytes<M>(row.p[k] + x, v);
+            #pragma GCC unroll 4
             for (int m = 0; m < M; ++m)
                 w[m].c[k] = v[m];
         }
@@ -58,6 +61,7 @@ struct WideIo<OutPacked<4, O, Fourth::Keep>> {
     template <int M>
     static void put(const typename OutPacked<4, O, Fourth::Keep>::Row& row, int x, const W3 (&w)[M], const Ctx&)
     {
+        #pragma GCC unroll 4
         for (int m = 0; m < M; ++m) {
             const V bytes = packUs(packs32(w[m].c[0], w[m].c[1]), packs32(w[m].c[2], w[m].c[2]));
             const V px = shuffle(bytes, maskOf(kPixelDwords<channelByte(O, 0), channelByte(O, 1), channelByte(O, 2)>));
@@ -84,8 +88,10 @@ struct WideIo<OutPlanar<P>> {
     template <int M>
     static void put(const typename OutPlanar<P>::Row& row, int x, const W3 (&w)[M], const Ctx&)
     {
+        #pragma GCC unroll 3
         for (int k = 0; k < 3; ++k) {
             V v[M];
+            #pragma GCC unroll 4
             for (int m = 0; m < M; ++m)
                 v[m] = w[m].c[k];
             narrowBytes<M>(row.p[k] + x, v);
@@ -106,6 +112,7 @@ int wideRow(const typename C::Src::Row& sRow, const typename C::Dst::Row& dRow, 
         auto turn = [&]<int M>(int x) {
             W3 w[M];
             WideIo<Src>::template get<M>(s, x, w);
+            #pragma GCC unroll 4
             for (int m = 0; m < M; ++m)
                 Wide<typename C::Rem>::apply(w[m]);
             WideIo<Dst>::template put<M>(d, x, w, ctx);
