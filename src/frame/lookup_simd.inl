@@ -1,5 +1,5 @@
-// The byte-shuffle lookup of a 256-entry table (see byte_table.hpp), written once against the
-// vocabulary of an instruction set and included inside its namespace.
+// The byte-shuffle lookup of a 256-entry table (see byte_table.hpp), written against the vector
+// vocabulary and included inside the namespace of a kernel set (the AVX2 set: see byte_table.hpp).
 
 inline V lookup256(V x, const ShuffleTable& t)
 {

@@ -103,8 +103,9 @@ void sweep(const char* name, F f)
             auto& outBefore = ip ? srcBefore : dstBefore;
             ASSERT_EQ(call<T>(f, src, srcP[0]->shape().step, dst, dstP[0]->shape().step, ImageSize{w, h}, range), zoxStatusOk);
             for (int p = 0; p < L::planes; ++p) {
-                if (!ip)
+                if (!ip) {
                     ASSERT_EQ(srcP[p]->bytes(), srcBefore[p]) << "source changed";
+                }
                 ASSERT_EQ(outP[p]->firstGuardChange(outBefore[p]), -1) << "written outside the region";
                 const auto& sp = srcP[p]->shape();
                 for (int r = 0; r < h; ++r) {
