@@ -10,16 +10,17 @@ namespace {
 
 using namespace zox;
 
-template <class L, class Ptr>
+template <class L>
 struct Buffers {
+    using T = typename L::Sample;
     std::vector<std::vector<uint8_t>> planes;
-    std::vector<Ptr> ptrs;
+    std::vector<T*> ptrs;
     int step;
     Buffers(Size s, uint32_t seed) : step(s.width * L::bytesPerPixel)
     {
         for (int p = 0; p < L::planes; ++p) {
             planes.push_back(randomBytes(static_cast<std::size_t>(step) * s.height, seed + p));
-            ptrs.push_back(planes.back().data());
+            ptrs.push_back(reinterpret_cast<T*>(planes.back().data()));
         }
     }
     typename L::Arg arg()
@@ -40,11 +41,11 @@ void registerConv(const char* name, F f)
         const std::size_t px = static_cast<std::size_t>(size.width) * size.height;
         const std::size_t bytes = px * (Src::planes * Src::bytesPerPixel + Dst::planes * Dst::bytesPerPixel);
         registerCase(name, size, bytes, [f](Size s) -> Call {
-            auto src = std::make_shared<Buffers<Src, const uint8_t*>>(s, 1);
-            auto dst = std::make_shared<Buffers<Dst, uint8_t*>>(s, 9);
+            auto src = std::make_shared<Buffers<Src>>(s, 1);
+            auto dst = std::make_shared<Buffers<Dst>>(s, 9);
             return [f, src, dst, s] {
                 if constexpr (std::is_invocable_v<F, typename Src::Arg, int, typename Dst::Arg, int, ImageSize, uint8_t>)
-                    f(src->arg(), src->step, dst->arg(), dst->step, ImageSize{s.width, s.height}, uint8_t{255});
+                    f(src->arg(), src->step, dst->arg(), dst->step, ImageSize{s.width, s.height}, typename Dst::Sample{127});
                 else
                     f(src->arg(), src->step, dst->arg(), dst->step, ImageSize{s.width, s.height});
             };

@@ -194,6 +194,51 @@ ZOXCC_API zoxStatus zoxiGammaInv_32f_AC4IR(float* srcDst, int srcDstStep, ImageS
 ZOXCC_API zoxStatus zoxiGammaInv_32f_P3R(const float* const src[3], int srcStep, float* const dst[3], int dstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
 ZOXCC_API zoxStatus zoxiGammaInv_32f_IP3R(float* const srcDst[3], int srcDstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
 
+/* ---- RGB <-> YCoCg, 8u / 16s / 32s --------------------------------------------------------------------
+ * Y = (R + 2G + B + 2) >> 2, Co = (R - B + 1) >> 1, Cg = (2G - R - B + 2) >> 2 (plain), or the reversible
+ * lifting form (_Rev): Co = R - B, t = B + (Co >> 1), Cg = G - t, Y = t + (Cg >> 1), undone exactly by
+ * t = Y - (Cg >> 1), G = Cg + t, B = t - (Co >> 1), R = B + Co. Plain reverse: R = Y + Co - Cg,
+ * G = Y + Cg, B = Y - Co - Cg. Right shifts are arithmetic (toward minus infinity).
+ * Colour side interleaved: B,G,R in channels 0..2 (R,G,B in the two RGB members); C4P3R ignores channel
+ * 3, P3C4R writes alpha there. YCoCg side: planes Y, Co, Cg, one step for all three. Widths: 8u16s
+ * forward and 16s32s forward in 32 bits, stored as computed; 16s forward plain in 32 bits, saturated to
+ * 16 bits in blocks of 4 pixels and reduced to the low 16 bits in the last width % 4 pixels (the only
+ * place-dependent result: Co and Cg can reach 32768); 16s forward _Rev wraps to 16 bits at every step;
+ * 16s8u reverse wraps to 16 bits and clamps each result to 0..255; 16s and 32s16s reverse keep the low
+ * 16 bits. The 8u RGB pair biases chroma by 128: forward Co + 128 limited to 255, Cg + 128 to 0..255;
+ * reverse R = Y + Co - Cg, G = Y + Cg - 128, B = Y - Co - Cg + 256, each clamped to 0..255.
+ * Checks: the interleaved pointer, the plane array and each plane (zoxStatusNullPointer), then, for
+ * these members only, a size below 1 (zoxStatusBadSize): RGBToYCoCg_8u_C3P3R, BGRToYCoCg_8u16s C3P3R and
+ * C4P3R, BGRToYCoCg_Rev_8u16s C3P3R and C4P3R, SBGRToYCoCg_16s C3P3R and C4P3R, SBGRToYCoCg_16s32s_C3P3R,
+ * SBGRToYCoCg_Rev_16s32s_C3P3R, YCoCgToSBGR_16s_P3C4R, YCoCgToSBGR_32s16s C3 and C4. The others return
+ * zoxStatusOk and write nothing for a size below 1. Steps are not examined. */
+ZOXCC_API zoxStatus zoxiRGBToYCoCg_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCoCg_8u16s_C3P3R(const uint8_t* src, int srcStep, int16_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCoCg_8u16s_C4P3R(const uint8_t* src, int srcStep, int16_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiSBGRToYCoCg_16s_C3P3R(const int16_t* src, int srcStep, int16_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiSBGRToYCoCg_16s_C4P3R(const int16_t* src, int srcStep, int16_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiSBGRToYCoCg_16s32s_C3P3R(const int16_t* src, int srcStep, int32_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiSBGRToYCoCg_16s32s_C4P3R(const int16_t* src, int srcStep, int32_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCoCg_Rev_8u16s_C3P3R(const uint8_t* src, int srcStep, int16_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCoCg_Rev_8u16s_C4P3R(const uint8_t* src, int srcStep, int16_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiSBGRToYCoCg_Rev_16s_C3P3R(const int16_t* src, int srcStep, int16_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiSBGRToYCoCg_Rev_16s_C4P3R(const int16_t* src, int srcStep, int16_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiSBGRToYCoCg_Rev_16s32s_C3P3R(const int16_t* src, int srcStep, int32_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiSBGRToYCoCg_Rev_16s32s_C4P3R(const int16_t* src, int srcStep, int32_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCoCgToRGB_8u_P3C3R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCoCgToBGR_16s8u_P3C3R(const int16_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCoCgToBGR_16s8u_P3C4R(const int16_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCoCgToSBGR_16s_P3C3R(const int16_t* const src[3], int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCoCgToSBGR_16s_P3C4R(const int16_t* const src[3], int srcStep, int16_t* dst, int dstStep, ImageSize roiSize, int16_t alpha);
+ZOXCC_API zoxStatus zoxiYCoCgToSBGR_32s16s_P3C3R(const int32_t* const src[3], int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCoCgToSBGR_32s16s_P3C4R(const int32_t* const src[3], int srcStep, int16_t* dst, int dstStep, ImageSize roiSize, int16_t alpha);
+ZOXCC_API zoxStatus zoxiYCoCgToBGR_Rev_16s8u_P3C3R(const int16_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCoCgToBGR_Rev_16s8u_P3C4R(const int16_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCoCgToSBGR_Rev_16s_P3C3R(const int16_t* const src[3], int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCoCgToSBGR_Rev_16s_P3C4R(const int16_t* const src[3], int srcStep, int16_t* dst, int dstStep, ImageSize roiSize, int16_t alpha);
+ZOXCC_API zoxStatus zoxiYCoCgToSBGR_Rev_32s16s_P3C3R(const int32_t* const src[3], int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCoCgToSBGR_Rev_32s16s_P3C4R(const int32_t* const src[3], int srcStep, int16_t* dst, int dstStep, ImageSize roiSize, int16_t alpha);
+
 #ifdef __cplusplus
 }
 #endif

@@ -20,11 +20,13 @@ struct NoBlock {};
 // Order of the argument checks of the generic layer.
 enum class Checks {
     PointersSizesPlanes, // src/dst null, sizes, then every plane pointer
-    PointersPlanesSizes  // src/dst and every plane pointer, then sizes
+    PointersPlanesSizes, // src/dst and every plane pointer, then sizes
+    PointersPlanesEmpty  // src/dst and every plane pointer; a size below 1 converts nothing and is no error
 };
 // Short names for the table rows.
 inline constexpr Checks PlanesLast = Checks::PointersSizesPlanes;
 inline constexpr Checks PlanesFirst = Checks::PointersPlanesSizes;
+inline constexpr Checks PlanesFirstEmptyOk = Checks::PointersPlanesEmpty;
 
 template <class Src_, class Dst_, int N_, class Block_, class Rem_, Checks C_>
 struct Conv {
@@ -111,11 +113,11 @@ zoxStatus convert(typename C::Src::Arg src, int srcStep, typename C::Dst::Arg ds
     using Dst = typename C::Dst;
     if (!src || !dst)
         return zoxStatusNullPointer;
-    if constexpr (C::checks == Checks::PointersPlanesSizes)
+    if constexpr (C::checks != Checks::PointersSizesPlanes)
         if (!Src::planesValid(src) || !Dst::planesValid(dst))
             return zoxStatusNullPointer;
     if (roi.width < 1 || roi.height < 1)
-        return zoxStatusBadSize;
+        return C::checks == Checks::PointersPlanesEmpty ? zoxStatusOk : zoxStatusBadSize;
     if constexpr (C::checks == Checks::PointersSizesPlanes)
         if (!Src::planesValid(src) || !Dst::planesValid(dst))
             return zoxStatusNullPointer;
@@ -141,10 +143,10 @@ zoxStatus convert(typename C::Src::Arg src, int srcStep, typename C::Dst::Arg ds
         return ::zox::convert<::zox::Conv<Src, Dst, N, Block, Rem, Chk>>(src, srcStep, dst, dstStep,      \
                                                                           roiSize, {});                    \
     }
-// src, srcStep, dst, dstStep, roiSize, alpha
+// src, srcStep, dst, dstStep, roiSize, alpha (of the destination's sample type)
 #define ZOX_SHAPE_SD_ALPHA(name, Src, Dst, N, Block, Rem, Chk)                                            \
     ZOXCC_API zoxStatus name(Src::Arg src, int srcStep, Dst::Arg dst, int dstStep, ImageSize roiSize,     \
-                             uint8_t alpha)                                                                \
+                             Dst::Sample alpha)                                                            \
     {                                                                                                       \
         return ::zox::convert<::zox::Conv<Src, Dst, N, Block, Rem, Chk>>(src, srcStep, dst, dstStep,      \
                                                                           roiSize, ::zox::Ctx{alpha});     \

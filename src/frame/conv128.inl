@@ -31,6 +31,21 @@ struct Io8<InPlanar<P>> {
     }
 };
 
+template <int P>
+struct Io8<InPlanar<P, int16_t>> {
+    template <int Shift>
+    static V3 get(const typename InPlanar<P, int16_t>::Row& row, int x)
+    {
+        static_assert(Shift == 0, "16-bit samples fill their lanes");
+        V3 v;
+#pragma GCC unroll 3
+        for (int k = 0; k < 3; ++k)
+            v.c[k] = load16(row.p[k] + 2 * static_cast<std::size_t>(x));
+        v.extra = zero();
+        return v;
+    }
+};
+
 template <int Bpp, Order O, Fourth F>
 struct Io8<OutPacked<Bpp, O, F>> {
     static void put(const typename OutPacked<Bpp, O, F>::Row& row, int x, const V3& v, const Ctx& ctx)
@@ -75,8 +90,9 @@ void stagedGroup(const typename C::Src::Row& s, const typename C::Dst::Row& d, i
 {
     using Src = typename C::Src;
     using Dst = typename C::Dst;
-    alignas(16) uint8_t in[Src::planes][32] = {};
-    alignas(16) uint8_t out[Dst::planes][32] = {};
+    // Room for the eight pixels the run reads and writes.
+    alignas(16) uint8_t in[Src::planes][8 * Src::bytesPerPixel] = {};
+    alignas(16) uint8_t out[Dst::planes][8 * Dst::bytesPerPixel] = {};
     typename Src::Row ls;
     typename Dst::Row ld;
     for (int p = 0; p < Src::planes; ++p) {

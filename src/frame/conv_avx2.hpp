@@ -52,7 +52,9 @@ inline void split(const V3& v, half::V3& lo, half::V3& hi)
 template <class C>
 void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx)
 {
-    if constexpr (C::N > 1) {
+    if constexpr (compilerVectorised<typename C::Block>) {
+        compiledBlocks<C>(s, d, n, ctx);
+    } else if constexpr (C::N > 1) {
         using F = Simd<typename C::Block>;
         constexpr int shift = inputShift<typename C::Block>;
         int x = wholeGroups<C>(s, d, n, ctx);

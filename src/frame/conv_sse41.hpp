@@ -19,7 +19,9 @@ namespace zox::sse41 {
 template <class C>
 void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx)
 {
-    if constexpr (C::N > 1) {
+    if constexpr (compilerVectorised<typename C::Block>) {
+        compiledBlocks<C>(s, d, n, ctx);
+    } else if constexpr (C::N > 1) {
         using F = Simd<typename C::Block>;
         constexpr int shift = inputShift<typename C::Block>;
         const int x = wholeGroups<C>(s, d, n, ctx);

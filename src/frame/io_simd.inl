@@ -31,6 +31,24 @@ constexpr int inputShiftOf()
 template <class Form>
 inline constexpr int inputShift = inputShiftOf<Form>();
 
+// The kernel of a form that has no hand-written SIMD form (it declares `compilerVectorised`): the form
+// itself over the block columns, compiled with this set's flags and vectorised by the compiler. Every
+// call inside is inlined (flatten), so that no shared inline function is emitted with this set's
+// instructions.
+template <class Form>
+inline constexpr bool compilerVectorised = requires { requires Form::compilerVectorised; };
+
+template <class C>
+[[gnu::flatten]] void compiledBlocks(const typename C::Src::Row& sRow, const typename C::Dst::Row& dRow, int n,
+                                     const Ctx& ctxIn)
+{
+    const typename C::Src::Row s = sRow;
+    const typename C::Dst::Row d = dRow;
+    const Ctx ctx = ctxIn;
+    for (int x = 0; x < n; ++x)
+        C::Dst::store(d, x, C::Block::apply(C::Src::load(s, x)), ctx);
+}
+
 // Readers and writers of sixteen pixels a lane: `a` holds pixels 0..7 of each lane's group, `b` 8..15.
 template <class L>
 struct GroupIo;
@@ -93,6 +111,25 @@ struct GroupIo<InPlanar<P>> {
         } else {
             a.extra = b.extra = zero();
         }
+    }
+};
+
+// Planes of 16-bit signed samples, taken as they are into the lanes (no shift).
+template <int P>
+struct GroupIo<InPlanar<P, int16_t>> {
+    static_assert(P == 3);
+    template <int Shift>
+    static void get(const typename InPlanar<P, int16_t>::Row& row, int x, V3& a, V3& b)
+    {
+        static_assert(Shift == 0, "16-bit samples fill their lanes");
+        constexpr std::size_t g = 32; // the next group of sixteen samples
+#pragma GCC unroll 3
+        for (int k = 0; k < 3; ++k) {
+            const uint8_t* q = row.p[k] + 2 * static_cast<std::size_t>(x);
+            a.c[k] = loadLanes(q, g);
+            b.c[k] = loadLanes(q + 16, g);
+        }
+        a.extra = b.extra = zero();
     }
 };
 

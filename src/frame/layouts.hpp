@@ -1,9 +1,11 @@
-// Pixel layouts of 8-bit three-channel images, scalar side: how a row of a layout is found from its
-// argument and step, and how one pixel is read from it or written to it.
+// Pixel layouts of three-channel images, scalar side: how a row of a layout is found from its argument
+// and step, and how one pixel is read from it or written to it. Samples are 8-bit unsigned unless a
+// layout names another type (T: uint8_t, int16_t or int32_t); rows are found by byte steps.
 #pragma once
 
 #include <cstddef>
 #include <cstdint>
+#include <cstring>
 
 namespace zox {
 
@@ -14,9 +16,10 @@ struct Px {
     uint8_t extra;
 };
 
-// Per-call values a destination layout may need.
+// Per-call values a destination layout may need: the fourth channel's value, in the destination's
+// sample type.
 struct Ctx {
-    uint8_t alpha = 0;
+    int alpha = 0;
 };
 
 // Channel order of an interleaved layout: channel k at byte k, or at byte 2 - k.
@@ -43,34 +46,63 @@ constexpr int channelByte(Order o, int k)
     return o == Order::Rgb ? k : 2 - k;
 }
 
-// Interleaved source: Bpp bytes a pixel (3, or 4 with a fourth byte that is carried as `extra`).
-template <int Bpp, Order O = Order::Rgb>
+// One sample of type T at byte address q, as an int; and an int stored as T (its low bits: an
+// unsigned or signed narrowing keeps the value modulo the type's range).
+template <class T>
+inline int loadSample(const uint8_t* q)
+{
+    if constexpr (sizeof(T) == 1) {
+        return static_cast<T>(*q);
+    } else {
+        T v;
+        std::memcpy(&v, q, sizeof(T));
+        return v;
+    }
+}
+template <class T>
+inline void storeSample(uint8_t* q, int v)
+{
+    const T t = static_cast<T>(v);
+    if constexpr (sizeof(T) == 1)
+        *q = static_cast<uint8_t>(t);
+    else
+        std::memcpy(q, &t, sizeof(T));
+}
+
+// Interleaved source: Ch samples a pixel (3, or 4 with a fourth 8-bit sample carried as `extra`).
+template <int Ch, Order O = Order::Rgb, class T = uint8_t>
 struct InPacked {
     static constexpr int planes = 1;
-    static constexpr int bytesPerPixel = Bpp;
+    static constexpr int channels = Ch;
+    static constexpr int bytesPerPixel = Ch * static_cast<int>(sizeof(T));
     static constexpr Order order = O;
-    using Arg = const uint8_t*;
+    using Sample = T;
+    using Arg = const T*;
     struct Row {
         const uint8_t* p[1];
     };
     static constexpr bool planesValid(Arg) { return true; }
-    static Row row(Arg a, int step, int r) { return {{rowAddress(a, step, r)}}; }
+    static Row row(Arg a, int step, int r) { return {{rowAddress(reinterpret_cast<const uint8_t*>(a), step, r)}}; }
     static Px load(const Row& row, int x)
     {
-        const uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * Bpp;
-        Px px{{q[channelByte(O, 0)], q[channelByte(O, 1)], q[channelByte(O, 2)]}, 0};
-        if constexpr (Bpp == 4)
+        constexpr int z = sizeof(T);
+        const uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * bytesPerPixel;
+        Px px{{loadSample<T>(q + z * channelByte(O, 0)), loadSample<T>(q + z * channelByte(O, 1)),
+               loadSample<T>(q + z * channelByte(O, 2))},
+              0};
+        if constexpr (Ch == 4 && z == 1)
             px.extra = q[3];
         return px;
     }
 };
 
 // Planar source: one plane a channel, in channel order.
-template <int P = 3>
+template <int P = 3, class T = uint8_t>
 struct InPlanar {
     static constexpr int planes = P;
-    static constexpr int bytesPerPixel = 1;
-    using Arg = const uint8_t* const*;
+    static constexpr int bytesPerPixel = static_cast<int>(sizeof(T));
+    using Sample = T;
+    using Arg = const T* const*;
     struct Row {
         const uint8_t* p[P];
     };
@@ -84,53 +116,60 @@ struct InPlanar {
     static Row row(Arg a, int step, int r)
     {
         Row row;
+        #pragma GCC unroll 4
         for (int i = 0; i < P; ++i)
-            row.p[i] = rowAddress(a[i], step, r);
+            row.p[i] = rowAddress(reinterpret_cast<const uint8_t*>(a[i]), step, r);
         return row;
     }
     static Px load(const Row& row, int x)
     {
-        Px px{{row.p[0][x], row.p[1][x], row.p[2][x]}, 0};
+        const std::size_t at = static_cast<std::size_t>(x) * sizeof(T);
+        Px px{{loadSample<T>(row.p[0] + at), loadSample<T>(row.p[1] + at), loadSample<T>(row.p[2] + at)}, 0};
         if constexpr (P == 4)
             px.extra = row.p[3][x];
         return px;
     }
 };
 
-// Interleaved destination. Samples arrive limited by clip8.
-template <int Bpp, Order O, Fourth F>
+// Interleaved destination; each sample is stored as T (8-bit ones arrive limited by clip8).
+template <int Ch, Order O, Fourth F, class T = uint8_t>
 struct OutPacked {
-    static_assert((Bpp == 3) == (F == Fourth::None));
+    static_assert((Ch == 3) == (F == Fourth::None));
     static constexpr int planes = 1;
-    static constexpr int bytesPerPixel = Bpp;
+    static constexpr int channels = Ch;
+    static constexpr int bytesPerPixel = Ch * static_cast<int>(sizeof(T));
     static constexpr Order order = O;
     static constexpr Fourth fourth = F;
-    using Arg = uint8_t*;
+    using Sample = T;
+    using Arg = T*;
     struct Row {
         uint8_t* p[1];
     };
     static constexpr bool planesValid(Arg) { return true; }
-    static Row row(Arg a, int step, int r) { return {{rowAddress(a, step, r)}}; }
+    static Row row(Arg a, int step, int r) { return {{rowAddress(reinterpret_cast<uint8_t*>(a), step, r)}}; }
     static void store(const Row& row, int x, const Px& px, const Ctx& ctx)
     {
-        uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * Bpp;
+        constexpr int z = sizeof(T);
+        uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * bytesPerPixel;
+        #pragma GCC unroll 3
         for (int k = 0; k < 3; ++k)
-            q[channelByte(O, k)] = static_cast<uint8_t>(px.c[k]);
+            storeSample<T>(q + z * channelByte(O, k), px.c[k]);
         if constexpr (F == Fourth::Alpha)
-            q[3] = ctx.alpha;
+            storeSample<T>(q + 3 * z, ctx.alpha);
         else if constexpr (F == Fourth::Zero)
-            q[3] = 0;
+            storeSample<T>(q + 3 * z, 0);
         else if constexpr (F == Fourth::Extra)
             q[3] = px.extra;
     }
 };
 
 // Planar destination; a fourth plane takes the source pixel's fourth byte.
-template <int P = 3>
+template <int P = 3, class T = uint8_t>
 struct OutPlanar {
     static constexpr int planes = P;
-    static constexpr int bytesPerPixel = 1;
-    using Arg = uint8_t* const*;
+    static constexpr int bytesPerPixel = static_cast<int>(sizeof(T));
+    using Sample = T;
+    using Arg = T* const*;
     struct Row {
         uint8_t* p[P];
     };
@@ -144,14 +183,17 @@ struct OutPlanar {
     static Row row(Arg a, int step, int r)
     {
         Row row;
+        #pragma GCC unroll 4
         for (int i = 0; i < P; ++i)
-            row.p[i] = rowAddress(a[i], step, r);
+            row.p[i] = rowAddress(reinterpret_cast<uint8_t*>(a[i]), step, r);
         return row;
     }
     static void store(const Row& row, int x, const Px& px, const Ctx&)
     {
+        const std::size_t at = static_cast<std::size_t>(x) * sizeof(T);
+        #pragma GCC unroll 3
         for (int k = 0; k < 3; ++k)
-            row.p[k][x] = static_cast<uint8_t>(px.c[k]);
+            storeSample<T>(row.p[k] + at, px.c[k]);
         if constexpr (P == 4)
             row.p[3][x] = px.extra;
     }

@@ -8,6 +8,7 @@
 #include <gtest/gtest.h>
 
 #include <array>
+#include <cstdint>
 #include <memory>
 #include <string>
 #include <type_traits>
@@ -18,8 +19,9 @@ namespace zt {
 // The planes of one side of a call.
 template <class L>
 struct Side {
+    using T = typename L::Sample;
     std::vector<std::unique_ptr<Plane>> planes;
-    std::vector<uint8_t*> ptrs;
+    std::vector<T*> ptrs; // the planes' first samples, typed
     int step = 0;
 
     Side(int rows, int width, int step_, int misalign, Rng& rng) : step(step_)
@@ -28,7 +30,7 @@ struct Side {
             // Planes of one side share the step but not their alignment.
             const int m = misalign < 0 ? -1 : (misalign + 5 * p) % 16;
             planes.push_back(std::make_unique<Plane>(PlaneShape{rows, width * L::bytesPerPixel, step, m}, rng));
-            ptrs.push_back(planes.back()->data());
+            ptrs.push_back(reinterpret_cast<T*>(planes.back()->data()));
         }
     }
     typename L::Arg arg()
@@ -79,10 +81,10 @@ template <class F, class C>
 constexpr bool takesAlpha = std::is_invocable_v<F, typename C::Src::Arg, int, typename C::Dst::Arg, int, ImageSize, uint8_t>;
 
 template <class C, class F>
-zoxStatus callExport(F f, typename C::Src::Arg s, int ss, typename C::Dst::Arg d, int ds, ImageSize roi, uint8_t alpha)
+zoxStatus callExport(F f, typename C::Src::Arg s, int ss, typename C::Dst::Arg d, int ds, ImageSize roi, int alpha)
 {
     if constexpr (takesAlpha<F, C>)
-        return f(s, ss, d, ds, roi, alpha);
+        return f(s, ss, d, ds, roi, static_cast<typename C::Dst::Sample>(alpha));
     else
         return f(s, ss, d, ds, roi);
 }
@@ -104,7 +106,7 @@ void checkCase(const char* name, F f, const SweepCase& k, Rng& rng)
     const auto srcBefore = src.bytes();
     const auto dstBefore = dst.bytes();
     want.restore(dstBefore);
-    const uint8_t alpha = static_cast<uint8_t>(rng());
+    const int alpha = static_cast<typename Dst::Sample>(rng()); // any value of the destination's samples
     const zox::Ctx ctx{alpha};
 
     SCOPED_TRACE(std::string(name) + " width " + std::to_string(k.width) + " height " + std::to_string(k.height) +
@@ -155,10 +157,12 @@ void checkValidation(const char* name, F f)
     using Src = typename C::Src;
     using Dst = typename C::Dst;
     Rng rng(7);
-    Side<Src> src(2, 8, 64, 0, rng);
-    Side<Dst> dst(2, 8, 64, 0, rng);
+    Side<Src> src(2, 8, 8 * Src::bytesPerPixel, 0, rng);
+    Side<Dst> dst(2, 8, 8 * Dst::bytesPerPixel, 0, rng);
     const auto before = dst.bytes();
-    const bool planesFirst = C::checks == zox::Checks::PointersPlanesSizes;
+    const bool planesFirst = C::checks != zox::Checks::PointersSizesPlanes;
+    // Members that take an empty size as nothing to do.
+    const zoxStatus badSize = C::checks == zox::Checks::PointersPlanesEmpty ? zoxStatusOk : zoxStatusBadSize;
     struct Row {
         const char* what;
         int srcNull, dstNull; // -1 none, 0.. plane index, 9 the pointer itself
@@ -168,19 +172,20 @@ void checkValidation(const char* name, F f)
     std::vector<Row> rows = {
         {"src null", 9, -1, {8, 2}, zoxStatusNullPointer},
         {"dst null", -1, 9, {8, 2}, zoxStatusNullPointer},
-        {"width 0", -1, -1, {0, 2}, zoxStatusBadSize},
-        {"height 0", -1, -1, {8, 0}, zoxStatusBadSize},
-        {"width -1", -1, -1, {-1, 2}, zoxStatusBadSize},
+        {"width 0", -1, -1, {0, 2}, badSize},
+        {"height 0", -1, -1, {8, 0}, badSize},
+        {"width -1", -1, -1, {-1, 2}, badSize},
+        {"height INT32_MIN", -1, -1, {8, INT32_MIN}, badSize},
         {"src null, width 0", 9, -1, {0, 2}, zoxStatusNullPointer},
         {"dst null, height -5", -1, 9, {8, -5}, zoxStatusNullPointer},
     };
     for (int p = 0; p < Src::planes && Src::planes > 1; ++p) {
         rows.push_back({"src plane null", p, -1, {8, 2}, zoxStatusNullPointer});
-        rows.push_back({"src plane null, width 0", p, -1, {0, 2}, planesFirst ? zoxStatusNullPointer : zoxStatusBadSize});
+        rows.push_back({"src plane null, width 0", p, -1, {0, 2}, planesFirst ? zoxStatusNullPointer : badSize});
     }
     for (int p = 0; p < Dst::planes && Dst::planes > 1; ++p) {
         rows.push_back({"dst plane null", -1, p, {8, 2}, zoxStatusNullPointer});
-        rows.push_back({"dst plane null, height 0", -1, p, {8, 0}, planesFirst ? zoxStatusNullPointer : zoxStatusBadSize});
+        rows.push_back({"dst plane null, height 0", -1, p, {8, 0}, planesFirst ? zoxStatusNullPointer : badSize});
     }
     for (const Row& row : rows) {
         SCOPED_TRACE(std::string(name) + ": " + row.what);
@@ -209,23 +214,39 @@ void checkValidation(const char* name, F f)
     }
 }
 
-// Writes one source pixel through the layout's own byte positions.
+// Writes one source pixel through the layout's own sample positions.
 template <class L>
 void putPx(const typename L::Row& row, int x, int c0, int c1, int c2, int extra)
 {
+    using T = typename L::Sample;
+    constexpr int z = sizeof(T);
     const int c[3] = {c0, c1, c2};
     if constexpr (L::planes == 1) {
         uint8_t* q = const_cast<uint8_t*>(row.p[0]) + static_cast<std::size_t>(x) * L::bytesPerPixel;
         for (int k = 0; k < 3; ++k)
-            q[zox::channelByte(L::order, k)] = static_cast<uint8_t>(c[k]);
-        if constexpr (L::bytesPerPixel == 4)
-            q[3] = static_cast<uint8_t>(extra);
+            zox::storeSample<T>(q + z * zox::channelByte(L::order, k), c[k]);
+        if constexpr (L::channels == 4)
+            zox::storeSample<T>(q + 3 * z, extra);
     } else {
         for (int k = 0; k < 3; ++k)
-            const_cast<uint8_t*>(row.p[k])[x] = static_cast<uint8_t>(c[k]);
+            zox::storeSample<T>(const_cast<uint8_t*>(row.p[k]) + static_cast<std::size_t>(x) * z, c[k]);
         if constexpr (L::planes == 4)
             const_cast<uint8_t*>(row.p[3])[x] = static_cast<uint8_t>(extra);
     }
+}
+
+// A sample of type T spread from a byte: 0..255 as they are for 8-bit samples; for wider ones the byte
+// scaled across the whole range (0 the most negative value, 255 the most positive), so that byte patterns
+// reach the extremes.
+template <class T>
+int spreadByte(int v)
+{
+    if constexpr (sizeof(T) == 1)
+        return v;
+    else if constexpr (sizeof(T) == 2)
+        return v * 257 - 32768;
+    else
+        return static_cast<int>(static_cast<uint32_t>(v) * 0x01010101u ^ 0x80000000u);
 }
 
 // The pixel `in` (channel order) at column x of a one-row image of width w, all other pixels zero,
@@ -243,12 +264,14 @@ std::array<int, 3> pixelAt(F f, std::array<int, 3> in, int x, int w)
     putPx<Src>(row, x, in[0], in[1], in[2], 0);
     const ImageSize roi{w, 1};
     if constexpr (std::is_invocable_v<F, typename Src::Arg, int, typename Dst::Arg, int, ImageSize, uint8_t>)
-        EXPECT_EQ(f(src.arg(), src.step, dst.arg(), dst.step, roi, uint8_t{0}), zoxStatusOk);
+        EXPECT_EQ(f(src.arg(), src.step, dst.arg(), dst.step, roi, typename Dst::Sample{0}), zoxStatusOk);
     else
         EXPECT_EQ(f(src.arg(), src.step, dst.arg(), dst.step, roi), zoxStatusOk);
+    using T = typename Dst::Sample;
     std::array<int, 3> out;
     for (int k = 0; k < 3; ++k)
-        out[k] = Dst::planes == 1 ? dst.planes[0]->data()[x * Dst::bytesPerPixel + k] : dst.planes[k]->data()[x];
+        out[k] = Dst::planes == 1 ? zox::loadSample<T>(dst.planes[0]->data() + x * Dst::bytesPerPixel + k * sizeof(T))
+                                  : zox::loadSample<T>(dst.planes[k]->data() + x * sizeof(T));
     return out;
 }
 
@@ -288,12 +311,14 @@ void diffKernels()
     if (sets.empty())
         GTEST_SKIP() << "no SIMD kernels in this build";
     Rng rng(99);
-    const int corners[] = {0, 1, 16, 127, 128, 129, 235, 240, 254, 255};
+    using T = typename Src::Sample;
+    const int corners[] = {spreadByte<T>(0), spreadByte<T>(1), 16, 127, 128, 129, 235, 240, spreadByte<T>(254), spreadByte<T>(255),
+                           -1, 0, 1};
     auto compare = [&](Side<Src>& src, int width, int dstMis) {
         Side<Dst> want(1, width, width * Dst::bytesPerPixel, dstMis, rng);
         Side<Dst> got(1, width, width * Dst::bytesPerPixel, dstMis, rng);
         const auto before = want.bytes();
-        const zox::Ctx ctx{static_cast<uint8_t>(rng())};
+        const zox::Ctx ctx{static_cast<typename Dst::Sample>(rng())};
         const auto s = Src::row(src.arg(), src.step, 0);
         rowThrough<C>(zox::KernelSet::Portable, s, Dst::row(want.arg(), want.step, 0), width, ctx);
         for (zox::KernelSet k : sets) {
@@ -311,7 +336,7 @@ void diffKernels()
             if (mis % 4 == 0) {
                 const auto row = Src::row(src.arg(), src.step, 0);
                 for (int x = 0; x < width; ++x)
-                    putPx<Src>(row, x, corners[rng() % 10], corners[rng() % 10], corners[rng() % 10], static_cast<int>(rng() & 255));
+                    putPx<Src>(row, x, corners[rng() % 13], corners[rng() % 13], corners[rng() % 13], static_cast<int>(rng() & 255));
             }
             compare(src, width, (mis * 5 + width + 17) % 17 - 1);
             if (::testing::Test::HasFatalFailure())
@@ -323,7 +348,7 @@ void diffKernels()
     const auto row = Src::row(src.arg(), src.step, 0);
     for (int c0 = 0; c0 < 256; ++c0) {
         for (int i = 0; i < 65536; ++i)
-            putPx<Src>(row, i, c0, i >> 8, i & 255, (i * 7) & 255);
+            putPx<Src>(row, i, spreadByte<T>(c0), spreadByte<T>(i >> 8), spreadByte<T>(i & 255), (i * 7) & 255);
         compare(src, 65536, c0 % 16);
         if (::testing::Test::HasFatalFailure())
             return;
