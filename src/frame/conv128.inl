@@ -70,6 +70,15 @@ struct Io8<OutPacked<Bpp, O, F>> {
     }
 };
 
+template <Order O>
+struct Io8<OutPacked<4, O, Fourth::Alpha, int16_t>> {
+    static void put(const typename OutPacked<4, O, Fourth::Alpha, int16_t>::Row& row, int x, const V3& v, const Ctx& ctx)
+    {
+        GroupIo<OutPacked<4, O, Fourth::Alpha, int16_t>>::put8(row.p[0] + static_cast<std::size_t>(x) * 8, 0, v,
+                                                               splat16(ctx.alpha));
+    }
+};
+
 template <int P>
 struct Io8<OutPlanar<P>> {
     static void put(const typename OutPlanar<P>::Row& row, int x, const V3& v, const Ctx&)

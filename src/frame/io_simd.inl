@@ -175,6 +175,32 @@ struct GroupIo<OutPacked<Bpp, O, F>> {
     }
 };
 
+// Four 16-bit signed samples a pixel, the fourth the call's alpha: each eight pixels are interleaved by
+// 16- and 32-bit unpacks into four stores.
+template <Order O>
+struct GroupIo<OutPacked<4, O, Fourth::Alpha, int16_t>> {
+    using L = OutPacked<4, O, Fourth::Alpha, int16_t>;
+    // Pixels 0..7 of each lane's group from the lanes of v, at q (the next group g bytes on).
+    static void put8(uint8_t* q, std::size_t g, const V3& v, V alpha)
+    {
+        const V s0 = v.c[channelByte(O, 0) == 0 ? 0 : 2], s1 = v.c[1], s2 = v.c[channelByte(O, 0) == 0 ? 2 : 0];
+        const V lo01 = unpackLo16(s0, s1), hi01 = unpackHi16(s0, s1);
+        const V lo23 = unpackLo16(s2, alpha), hi23 = unpackHi16(s2, alpha);
+        storeLanes(q, g, unpackLo32(lo01, lo23));
+        storeLanes(q + 16, g, unpackHi32(lo01, lo23));
+        storeLanes(q + 32, g, unpackLo32(hi01, hi23));
+        storeLanes(q + 48, g, unpackHi32(hi01, hi23));
+    }
+    static void put(const typename L::Row& row, int x, const V3& a, const V3& b, const Ctx& ctx)
+    {
+        constexpr std::size_t g = 16 * 8;
+        uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * 8;
+        const V alpha = splat16(ctx.alpha);
+        put8(q, g, a, alpha);
+        put8(q + 64, g, b, alpha);
+    }
+};
+
 template <int P>
 struct GroupIo<OutPlanar<P>> {
     static void put(const typename OutPlanar<P>::Row& row, int x, const V3& a, const V3& b, const Ctx&)

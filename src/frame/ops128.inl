@@ -63,6 +63,8 @@ inline V unpackLo8(V a, V b) { return _mm_unpacklo_epi8(a, b); }
 inline V unpackHi8(V a, V b) { return _mm_unpackhi_epi8(a, b); }
 inline V unpackLo16(V a, V b) { return _mm_unpacklo_epi16(a, b); }
 inline V unpackHi16(V a, V b) { return _mm_unpackhi_epi16(a, b); }
+inline V unpackLo32(V a, V b) { return _mm_unpacklo_epi32(a, b); }
+inline V unpackHi32(V a, V b) { return _mm_unpackhi_epi32(a, b); }
 inline V loadLanes(const uint8_t* q, std::size_t) { return load16(q); }
 inline void storeLanes(uint8_t* q, std::size_t, V v) { store16(q, v); }
 

@@ -48,6 +48,8 @@ inline V unpackLo8(V a, V b) { return _mm256_unpacklo_epi8(a, b); }
 inline V unpackHi8(V a, V b) { return _mm256_unpackhi_epi8(a, b); }
 inline V unpackLo16(V a, V b) { return _mm256_unpacklo_epi16(a, b); }
 inline V unpackHi16(V a, V b) { return _mm256_unpackhi_epi16(a, b); }
+inline V unpackLo32(V a, V b) { return _mm256_unpacklo_epi32(a, b); }
+inline V unpackHi32(V a, V b) { return _mm256_unpackhi_epi32(a, b); }
 // Contiguous lanes (a plane's bytes, g = 16) move as one 256-bit access.
 inline V loadLanes(const uint8_t* q, std::size_t g)
 {

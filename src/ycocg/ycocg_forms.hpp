@@ -95,14 +95,15 @@ struct Lifting16 {
 
 // ---- reverse ------------------------------------------------------------------------------------------
 
-// What a reverse form does with its results: keep them (stored as the destination keeps them), or take
-// their low 16 bits as a signed value and clamp that to 0..255 (8-bit destinations).
-enum class Out { Keep, Wrap16Clamp8 };
+// What a reverse form does with its results: keep them (stored as the destination keeps them), take
+// their low 16 bits (the same for 16-bit destinations, with a SIMD form over 16-bit lanes), or take
+// the low 16 bits as a signed value and clamp that to 0..255 (8-bit destinations).
+enum class Out { Keep, Wrap16, Wrap16Clamp8 };
 
 template <Out O>
 constexpr int finish(int v)
 {
-    return O == Out::Keep ? v : clampTo(wrap16(v), 0, 255);
+    return O == Out::Keep ? v : O == Out::Wrap16 ? wrap16(v) : clampTo(wrap16(v), 0, 255);
 }
 
 // The plain reverse form; sums wrap as 32-bit values, so 32-bit planes of any value are defined.

@@ -1,5 +1,5 @@
-// RGB <-> YCoCg SIMD forms over 16-bit lanes, for the members with 8-bit colour sides whose sums fit 16
-// bits. Included inside the namespace of each instruction set, after its vector vocabulary. Lane sums
+// RGB <-> YCoCg SIMD forms over 16-bit lanes, for the members whose sums fit 16 bits or wrap there: the
+// 8-bit colour sides and the reverse forms from 16-bit planes into bytes or four 16-bit channels. Included inside the namespace of each instruction set, after its vector vocabulary. Lane sums
 // wrap at 16 bits as the forms' Wrap16 results do, and the unsigned saturating pack to bytes is their
 // clamp to 0..255.
 
@@ -27,8 +27,9 @@ struct Simd<ycocg::RgbFromPlainBiased> {
     }
 };
 
-template <>
-struct Simd<ycocg::RgbFromPlain<ycocg::Out::Wrap16Clamp8>> {
+template <ycocg::Out O>
+struct Simd<ycocg::RgbFromPlain<O>> {
+    static_assert(O != ycocg::Out::Keep);
     static void apply(V3& v)
     {
         const V y = v.c[0], co = v.c[1], cg = v.c[2];
@@ -38,8 +39,9 @@ struct Simd<ycocg::RgbFromPlain<ycocg::Out::Wrap16Clamp8>> {
     }
 };
 
-template <>
-struct Simd<ycocg::RgbFromLifting<ycocg::Out::Wrap16Clamp8>> {
+template <ycocg::Out O>
+struct Simd<ycocg::RgbFromLifting<O>> {
+    static_assert(O != ycocg::Out::Keep);
     static void apply(V3& v)
     {
         const V y = v.c[0], co = v.c[1], cg = v.c[2];

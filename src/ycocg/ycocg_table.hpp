@@ -1,9 +1,10 @@
 // RGB <-> YCoCg exports: one row an export.
 //   X(name, shape, Src, Dst, N, block form, remainder form, checks)
 // The colour side is interleaved (B, G, R in channels 0..2, or R, G, B in the two RGB members), the
-// YCoCg side three planes Y, Co, Cg. Blocks are four pixels; block and remainder forms are the same form
-// but in the two 16-bit signed plain forward members, whose blocks saturate where their remainder
-// columns keep the low 16 bits. Members without a size check convert nothing for a size below 1.
+// YCoCg side three planes Y, Co, Cg. Blocks are four pixels (rows whose pointers all lie on 16 bytes may
+// run eight at a time, which covers the same columns: the block columns are width & ~3 either way);
+// block and remainder forms are the same form but in the two 16-bit signed plain forward members,
+// whose blocks saturate where their remainder columns keep the low 16 bits. Members without a size check convert nothing for a size below 1.
 #pragma once
 
 #include "ycocg/ycocg_forms.hpp"
@@ -32,6 +33,9 @@ using RgbFromPlainKeep = RgbFromPlain<Out::Keep>;
 using RgbFromPlainClamp8 = RgbFromPlain<Out::Wrap16Clamp8>;
 using RgbFromLiftingKeep = RgbFromLifting<Out::Keep>;
 using RgbFromLiftingClamp8 = RgbFromLifting<Out::Wrap16Clamp8>;
+// The same values as Keep into 16-bit samples; these have SIMD forms over 16-bit lanes.
+using RgbFromPlainWrap16 = RgbFromPlain<Out::Wrap16>;
+using RgbFromLiftingWrap16 = RgbFromLifting<Out::Wrap16>;
 } // namespace ycocg
 } // namespace zox
 
@@ -57,7 +61,7 @@ using RgbFromLiftingClamp8 = RgbFromLifting<Out::Wrap16Clamp8>;
       PlanesFirstEmptyOk)                                                                                                               \
     X(zoxiYCoCgToSBGR_16s_P3C3R, ZOX_SHAPE_SD, InP3_16s, OutBGR16s, 4, ycocg::RgbFromPlainKeep, ycocg::RgbFromPlainKeep,              \
       PlanesFirstEmptyOk)                                                                                                               \
-    X(zoxiYCoCgToSBGR_16s_P3C4R, ZOX_SHAPE_SD_ALPHA, InP3_16s, OutBGRA16s, 4, ycocg::RgbFromPlainKeep, ycocg::RgbFromPlainKeep,       \
+    X(zoxiYCoCgToSBGR_16s_P3C4R, ZOX_SHAPE_SD_ALPHA, InP3_16s, OutBGRA16s, 4, ycocg::RgbFromPlainWrap16, ycocg::RgbFromPlainWrap16,   \
       PlanesFirst)                                                                                                                      \
     X(zoxiYCoCgToSBGR_32s16s_P3C3R, ZOX_SHAPE_SD, InP3_32s, OutBGR16s, 4, ycocg::RgbFromPlainKeep, ycocg::RgbFromPlainKeep,           \
       PlanesFirst)                                                                                                                      \
@@ -69,8 +73,8 @@ using RgbFromLiftingClamp8 = RgbFromLifting<Out::Wrap16Clamp8>;
       ycocg::RgbFromLiftingClamp8, PlanesFirstEmptyOk)                                                                                  \
     X(zoxiYCoCgToSBGR_Rev_16s_P3C3R, ZOX_SHAPE_SD, InP3_16s, OutBGR16s, 4, ycocg::RgbFromLiftingKeep, ycocg::RgbFromLiftingKeep,      \
       PlanesFirstEmptyOk)                                                                                                               \
-    X(zoxiYCoCgToSBGR_Rev_16s_P3C4R, ZOX_SHAPE_SD_ALPHA, InP3_16s, OutBGRA16s, 4, ycocg::RgbFromLiftingKeep,                          \
-      ycocg::RgbFromLiftingKeep, PlanesFirstEmptyOk)                                                                                    \
+    X(zoxiYCoCgToSBGR_Rev_16s_P3C4R, ZOX_SHAPE_SD_ALPHA, InP3_16s, OutBGRA16s, 4, ycocg::RgbFromLiftingWrap16,                        \
+      ycocg::RgbFromLiftingWrap16, PlanesFirstEmptyOk)                                                                                    \
     X(zoxiYCoCgToSBGR_Rev_32s16s_P3C3R, ZOX_SHAPE_SD, InP3_32s, OutBGR16s, 4, ycocg::RgbFromLiftingKeep, ycocg::RgbFromLiftingKeep,   \
       PlanesFirstEmptyOk)                                                                                                               \
     X(zoxiYCoCgToSBGR_Rev_32s16s_P3C4R, ZOX_SHAPE_SD_ALPHA, InP3_32s, OutBGRA16s, 4, ycocg::RgbFromLiftingKeep,                       \

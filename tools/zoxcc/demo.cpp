@@ -120,6 +120,50 @@ void gammaDemo(Demo& d)
     d.write("gamma-encoded-16u.ppm", enc16);
 }
 
+// The 8u pair with chroma biased by 128, and the reversible pair through 16-bit planes (the picture's
+// bytes taken as B, G, R), which must give the picture back bit for bit.
+void ycocgDemo(Demo& d)
+{
+    const Image& in = d.input();
+    const ImageSize roi{in.width, in.height};
+    const std::size_t n = pixels(in);
+    std::vector<Image> planes(3, Image(in.width, in.height, 1));
+    uint8_t* p8[3] = {planes[0].data(), planes[1].data(), planes[2].data()};
+    const uint8_t* c8[3] = {p8[0], p8[1], p8[2]};
+    Image out(in.width, in.height, 3);
+    d.time("zoxiRGBToYCoCg_8u_C3P3R", n * 6, [&] { return zoxiRGBToYCoCg_8u_C3P3R(in.data(), in.step(), p8, in.width, roi); });
+    d.time("zoxiYCoCgToRGB_8u_P3C3R", n * 6, [&] { return zoxiYCoCgToRGB_8u_P3C3R(c8, in.width, out.data(), out.step(), roi); });
+    const char* names[3] = {"y", "co", "cg"};
+    for (int k = 0; k < 3; ++k)
+        d.write(std::string("ycocg-") + names[k] + ".pgm", planes[k]);
+    d.write("ycocg-roundtrip.ppm", out);
+
+    std::vector<int16_t> wide(n * 3);
+    int16_t* p16[3] = {wide.data(), wide.data() + n, wide.data() + 2 * n};
+    const int16_t* c16[3] = {p16[0], p16[1], p16[2]};
+    Image back(in.width, in.height, 3);
+    const int step16 = in.width * 2;
+    d.time("zoxiBGRToYCoCg_Rev_8u16s_C3P3R", n * 9,
+           [&] { return zoxiBGRToYCoCg_Rev_8u16s_C3P3R(in.data(), in.step(), p16, step16, roi); });
+    d.time("zoxiYCoCgToBGR_Rev_16s8u_P3C3R", n * 9,
+           [&] { return zoxiYCoCgToBGR_Rev_16s8u_P3C3R(c16, step16, back.data(), back.step(), roi); });
+    std::size_t differ = 0;
+    for (std::size_t i = 0; i < back.pixels.size(); ++i)
+        differ += back.pixels[i] != in.pixels[i];
+    if (differ == 0)
+        std::printf("ycocg: the reversible round trip is bit-exact (%zu pixels)\n", n);
+    else
+        std::printf("ycocg: the reversible round trip changed %zu samples\n", differ);
+    // Co and Cg of the reversible form span -255..255: shown halved around 128.
+    Image co(in.width, in.height, 1), cg(in.width, in.height, 1);
+    for (std::size_t i = 0; i < n; ++i) {
+        co.pixels[i] = static_cast<uint8_t>((p16[1][i] + 256) / 2);
+        cg.pixels[i] = static_cast<uint8_t>((p16[2][i] + 256) / 2);
+    }
+    d.write("ycocg-rev-co.pgm", co);
+    d.write("ycocg-rev-cg.pgm", cg);
+}
+
 } // namespace
 
 const std::vector<FamilyDemo>& familyDemos()
@@ -128,6 +172,7 @@ const std::vector<FamilyDemo>& familyDemos()
         {"RGB <-> YUV", yuvDemo},
         {"RGB <-> YCbCr", ycbcrDemo},
         {"Gamma", gammaDemo},
+        {"RGB <-> YCoCg", ycocgDemo},
     };
     return demos;
 }
