@@ -24,7 +24,11 @@ using Call = std::function<void()>;
 
 // Registers `name` at `size` (as "<name>/<W>x<H>"), moving `bytes` bytes of input plus output per call.
 // `prepare` builds the buffers once, outside the timing loop.
-void registerCase(const std::string& name, Size size, std::size_t bytes, std::function<Call(Size)> prepare);
+// What a case is timed against: a memcpy of its byte count (the usual), or a memset of it.
+enum class Baseline { Memcpy, Memset };
+
+void registerCase(const std::string& name, Size size, std::size_t bytes, std::function<Call(Size)> prepare,
+                  Baseline baseline = Baseline::Memcpy);
 
 // Registers a call of another library (as "peer:<name>/<W>x<H>"), timed and reported beside each of
 // our cases named in `ours` at the same size.

@@ -32,6 +32,7 @@ struct Pending {
     std::size_t bytes;
     std::function<Call(Size)> prepare;
     std::vector<std::string> peerOf; // for another library's call: the full names of our cases beside it
+    Baseline baseline = Baseline::Memcpy;
 };
 std::vector<Pending>& pending()
 {
@@ -44,17 +45,20 @@ std::string sizeTag(Size s)
     return std::to_string(s.width) + "x" + std::to_string(s.height);
 }
 
-std::string memcpyName(std::size_t bytes)
+std::string baselineName(Baseline k, std::size_t bytes)
 {
-    return "memcpy/" + std::to_string(bytes);
+    return (k == Baseline::Memset ? "memset/" : "memcpy/") + std::to_string(bytes);
 }
 
-void registerMemcpy(std::size_t bytes)
+void registerBaseline(Baseline k, std::size_t bytes)
 {
-    benchmark::RegisterBenchmark(memcpyName(bytes).c_str(), [bytes](benchmark::State& st) {
+    benchmark::RegisterBenchmark(baselineName(k, bytes).c_str(), [k, bytes](benchmark::State& st) {
         std::vector<uint8_t> a = randomBytes(bytes), b(bytes);
         for (auto _ : st) {
-            std::memcpy(b.data(), a.data(), bytes);
+            if (k == Baseline::Memset)
+                std::memset(b.data(), 0x5A, bytes);
+            else
+                std::memcpy(b.data(), a.data(), bytes);
             benchmark::DoNotOptimize(b.data());
             benchmark::ClobberMemory();
         }
@@ -112,9 +116,9 @@ std::vector<Row> registerSelected(const std::string& filter)
     for (const Pending& p : pending()) {
         if (!p.peerOf.empty() || !chosen.count(p.name))
             continue;
-        Row row{p.name, memcpyName(p.bytes), {}};
+        Row row{p.name, baselineName(p.baseline, p.bytes), {}};
         if (registered.insert(row.baseline).second)
-            registerMemcpy(p.bytes);
+            registerBaseline(p.baseline, p.bytes);
         registerCall(p);
         for (const Pending& q : pending())
             if (std::find(q.peerOf.begin(), q.peerOf.end(), p.name) != q.peerOf.end()) {
@@ -185,7 +189,7 @@ void printTable(const std::vector<Row>& rows, const std::map<std::string, double
     const std::string cpu = cpuModel(), cc = compiler(), isa = kernelSet();
 
     std::printf("\nCPU       %s\ncompiler  %s\nkernels   %s\n\n", cpu.c_str(), cc.c_str(), isa.c_str());
-    std::printf("%-46s %11s %11s %9s %10s\n", "case", "time (us)", "memcpy (us)", "x memcpy", "ours/peer");
+    std::printf("%-46s %11s %11s %9s %10s\n", "case", "time (us)", "base (us)", "x base", "ours/peer");
     for (const Row& r : rows) {
         const double t = time(r.name), m = time(r.baseline);
         if (t < 0 || m < 0)
@@ -199,7 +203,7 @@ void printTable(const std::vector<Row>& rows, const std::map<std::string, double
     if (!markdown)
         return;
     std::printf("\n- CPU: %s\n- Compiler: %s\n- Kernels: %s\n\n", cpu.c_str(), cc.c_str(), isa.c_str());
-    std::printf("| Case | Time (us) | memcpy (us) | x memcpy | Peers: time (us), ours/peer |\n");
+    std::printf("| Case | Time (us) | baseline (us) | x baseline | Peers: time (us), ours/peer |\n");
     std::printf("|---|---:|---:|---:|---|\n");
     for (const Row& r : rows) {
         const double t = time(r.name), m = time(r.baseline);
@@ -218,9 +222,9 @@ void printTable(const std::vector<Row>& rows, const std::map<std::string, double
 
 } // namespace
 
-void registerCase(const std::string& name, Size size, std::size_t bytes, std::function<Call(Size)> prepare)
+void registerCase(const std::string& name, Size size, std::size_t bytes, std::function<Call(Size)> prepare, Baseline baseline)
 {
-    pending().push_back({name + "/" + sizeTag(size), size, bytes, std::move(prepare), {}});
+    pending().push_back({name + "/" + sizeTag(size), size, bytes, std::move(prepare), {}, baseline});
 }
 
 void registerPeer(const std::string& name, const std::vector<std::string>& ours, Size size, std::size_t bytes,

@@ -2,6 +2,7 @@
 namespace zb {
 void registerConvFamilies();
 void registerGammaFamily();
+void registerPlanesAndToneMaps();
 void registerLibyuvPeers();
 void registerOpenCVPeers();
 
@@ -9,6 +10,7 @@ void registerAll()
 {
     registerConvFamilies();
     registerGammaFamily();
+    registerPlanesAndToneMaps();
     registerLibyuvPeers();
     registerOpenCVPeers();
 }

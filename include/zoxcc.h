@@ -239,6 +239,22 @@ ZOXCC_API zoxStatus zoxiYCoCgToSBGR_Rev_16s_P3C4R(const int16_t* const src[3], i
 ZOXCC_API zoxStatus zoxiYCoCgToSBGR_Rev_32s16s_P3C3R(const int32_t* const src[3], int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
 ZOXCC_API zoxStatus zoxiYCoCgToSBGR_Rev_32s16s_P3C4R(const int32_t* const src[3], int srcStep, int16_t* dst, int dstStep, ImageSize roiSize, int16_t alpha);
 
+/* ---- Tone mapping, 32f to 8u ------------------------------------------------------------------------
+ * One channel of floats to bytes by one global scale. ToneMapLinear maps the maximum M (in single
+ * precision, samples that are not numbers ignored) to 255: each product s * (255 / M) is truncated to a
+ * 32-bit integer and its low byte stored (a negative sample wraps). ToneMapMean maps twice the mean T
+ * to 255: the truncated product s * (float)(255 / T) saturated to 0..255. The sum of the mean is taken
+ * row by row in sixteen single-precision partial sums (a row's first samples up to a 16-byte boundary
+ * in the lanes of their places), folded into a double-precision total, so its last bits depend on the
+ * rows' alignment. A float to integer conversion out of the 32-bit range, or of a value that is not a
+ * number, gives the most negative integer (so 0 in both forms). A negative statistic returns
+ * zoxWarnNoOperation with nothing written; one not above the smallest normal float (1.1754944e-38) fills
+ * the region with 0. Source rows are found in whole floats (the low two bits of step times row are
+ * dropped); rows whose source and destination overlap are converted strictly left to right, so
+ * dst == src works. Checks: src/dst null, then sizes. */
+ZOXCC_API zoxStatus zoxiToneMapLinear_32f8u_C1R(const float* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiToneMapMean_32f8u_C1R(const float* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+
 #ifdef __cplusplus
 }
 #endif

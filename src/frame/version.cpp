@@ -1,6 +1,7 @@
 // The version record, and the one call made to the core services when the library loads: the feature
 // word that chooses the kernel set of a build holding more than one.
 #include "frame/kernel_set.hpp"
+#include "frame/planes.hpp"
 #include "zoxcc.h"
 #include "zoxcore.h"
 
@@ -18,10 +19,12 @@ constexpr const char* kBuildDate = "Oct  9 2014";
 constexpr LibraryVersion kPlain{8, 2, 1, 44077, {'p', '8', 0, 0}, "zoxCC SSE4.1/4.2 (p8)", kVersionText, kBuildDate};
 constexpr LibraryVersion kPlus{8, 2, 1, 44077, {'p', '8', 0, 0}, "zoxCC SSE4.1/4.2 (p8)+", kVersionText, kBuildDate};
 
-// The feature word is asked for once while the library loads; no call asks again.
+// The feature word is asked for once while the library loads, and the cache descriptors read; no call
+// asks again.
 [[gnu::constructor]] void chooseKernelsOnLoad()
 {
     zox::gLoadedKernelSet = zox::kernelSetFor(zoxGetEnabledCpuFeatures());
+    zox::probeCacheDescriptors();
 }
 
 } // namespace

@@ -11,16 +11,21 @@ std::atomic<int> freeCalls{0};
 std::atomic<int> failAfter{-1};
 std::atomic<int> feature128{0};
 std::atomic<int> featureWordCalls{0};
+std::atomic<int> cacheSizeCalls{0};
+std::atomic<int> cacheSizeFails{0};
 
 Scope::Scope()
 {
     mallocCalls = 0;
     freeCalls = 0;
     failAfter = -1;
+    cacheSizeCalls = 0;
+    cacheSizeFails = 0;
 }
 Scope::~Scope()
 {
     failAfter = -1;
+    cacheSizeFails = 0;
 }
 } // namespace zt::core
 
@@ -50,6 +55,9 @@ void zoxFree(void* ptr)
 
 int32_t zoxGetMaxCacheSizeB(int32_t* size)
 {
+    ++cacheSizeCalls;
+    if (cacheSizeFails)
+        return -1;
     *size = 1 << 20;
     return 0;
 }

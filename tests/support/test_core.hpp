@@ -12,6 +12,8 @@ extern std::atomic<int> freeCalls;
 extern std::atomic<int> failAfter;     // allocations still granted before the next ones fail; -1 never fail
 extern std::atomic<int> feature128;    // the answer of ownGetFeature(128, 0)
 extern std::atomic<int> featureWordCalls;
+extern std::atomic<int> cacheSizeCalls;  // calls of zoxGetMaxCacheSizeB
+extern std::atomic<int> cacheSizeFails;  // non-zero: zoxGetMaxCacheSizeB reports no size
 
 // Resets the counters and the failure setting for one test.
 struct Scope {

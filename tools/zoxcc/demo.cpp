@@ -3,6 +3,7 @@
 #include "zoxcc.h"
 
 #include <algorithm>
+#include <cmath>
 #include <chrono>
 #include <cstdio>
 
@@ -164,6 +165,32 @@ void ycocgDemo(Demo& d)
     d.write("ycocg-rev-cg.pgm", cg);
 }
 
+// A synthetic high-dynamic-range luminance: the picture's gray levels raised to an exponential ramp
+// across the width (about 11 stops), with a few highlights a hundred times brighter; both tone maps.
+void toneMapDemo(Demo& d)
+{
+    const Image& in = d.input();
+    const ImageSize roi{in.width, in.height};
+    std::vector<float> hdr(pixels(in));
+    for (int y = 0; y < in.height; ++y)
+        for (int x = 0; x < in.width; ++x) {
+            const uint8_t* p = &in.pixels[(std::size_t(y) * in.width + x) * 3];
+            float v = (p[0] + 2.0f * p[1] + p[2]) / 1020.0f * std::exp2(11.0f * x / in.width);
+            if ((x / 64 + y / 64) % 17 == 0 && x % 64 < 8 && y % 64 < 8)
+                v *= 100.0f;
+            hdr[std::size_t(y) * in.width + x] = v;
+        }
+    Image linear(in.width, in.height, 1), mean(in.width, in.height, 1);
+    d.time("zoxiToneMapLinear_32f8u_C1R", pixels(in) * 5, [&] {
+        return zoxiToneMapLinear_32f8u_C1R(hdr.data(), in.width * 4, linear.data(), linear.step(), roi);
+    });
+    d.time("zoxiToneMapMean_32f8u_C1R", pixels(in) * 5, [&] {
+        return zoxiToneMapMean_32f8u_C1R(hdr.data(), in.width * 4, mean.data(), mean.step(), roi);
+    });
+    d.write("tonemap-linear.pgm", linear);
+    d.write("tonemap-mean.pgm", mean);
+}
+
 } // namespace
 
 const std::vector<FamilyDemo>& familyDemos()
@@ -173,6 +200,7 @@ const std::vector<FamilyDemo>& familyDemos()
         {"RGB <-> YCbCr", ycbcrDemo},
         {"Gamma", gammaDemo},
         {"RGB <-> YCoCg", ycocgDemo},
+        {"Tone mapping", toneMapDemo},
     };
     return demos;
 }
