@@ -6,6 +6,7 @@
 
 #include <immintrin.h>
 
+#include <array>
 #include <cstddef>
 #include <cstdint>
 
@@ -13,17 +14,23 @@ namespace zox::avx2 {
 
 using V = __m256i;
 
-// A constant in every lane, loaded from constant data (a broadcast from a general register costs more
-// inside the loops).
-template <int K>
-struct Lanes16 {
-    static constexpr int16_t k = static_cast<int16_t>(K); // the lane pattern of K, also of an unsigned gain
-    alignas(32) static constexpr int16_t v[16] = {k, k, k, k, k, k, k, k, k, k, k, k, k, k, k, k};
+// A constant in every lane of type T, loaded from constant data (a broadcast from a general register
+// costs more inside the loops). K is taken as T: the lane pattern of K, also of an unsigned gain.
+template <class T, int K>
+struct Lanes {
+    static constexpr std::array<T, 32 / sizeof(T)> fill()
+    {
+        std::array<T, 32 / sizeof(T)> a{};
+        for (T& x : a)
+            x = static_cast<T>(K);
+        return a;
+    }
+    alignas(32) static constexpr std::array<T, 32 / sizeof(T)> v = fill();
 };
 template <int K>
 inline V splat16()
 {
-    return _mm256_load_si256(reinterpret_cast<const V*>(Lanes16<K>::v));
+    return _mm256_load_si256(reinterpret_cast<const V*>(Lanes<int16_t, K>::v.data()));
 }
 inline V mulHigh(V a, V k) { return _mm256_mulhi_epi16(a, k); }
 inline V mulHighU(V a, V k) { return _mm256_mulhi_epu16(a, k); }
@@ -68,13 +75,9 @@ inline void storeLanes(uint8_t* q, std::size_t g, V v)
 // 32-bit lanes, for the whole-row forms whose products need more than 16 bits: eight lanes.
 inline constexpr int kWideLanes = 8;
 template <int K>
-struct Lanes32 {
-    alignas(32) static constexpr int32_t v[8] = {K, K, K, K, K, K, K, K};
-};
-template <int K>
 inline V splat32()
 {
-    return _mm256_load_si256(reinterpret_cast<const V*>(Lanes32<K>::v));
+    return _mm256_load_si256(reinterpret_cast<const V*>(Lanes<int32_t, K>::v.data()));
 }
 inline V add32(V a, V b) { return _mm256_add_epi32(a, b); }
 inline V sub32(V a, V b) { return _mm256_sub_epi32(a, b); }

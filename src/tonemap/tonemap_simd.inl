@@ -41,6 +41,7 @@ inline __m128i bytes16(const float* s, float scale, bool lowByte)
 {
     const __m128 k = _mm_set1_ps(scale);
     __m128i v[4];
+    #pragma GCC unroll 4
     for (int i = 0; i < 4; ++i)
         v[i] = _mm_cvttps_epi32(_mm_mul_ps(_mm_loadu_ps(s + 4 * i), k));
     if (lowByte) {
@@ -57,13 +58,16 @@ inline constexpr int kAcc = 16 / kFloats; // accumulators of the sixteen lanes
 float maxRow(const float* s, int width, float m)
 {
     VF acc[kAcc];
+    #pragma GCC unroll 4
     for (int k = 0; k < kAcc; ++k)
         acc[k] = splatF(m);
     int x = 0;
     for (; x + 16 <= width; x += 16)
+        #pragma GCC unroll 4
         for (int k = 0; k < kAcc; ++k)
             acc[k] = maxF(loadF(s + x + kFloats * k), acc[k]);
     alignas(32) float lanes[16];
+    #pragma GCC unroll 4
     for (int k = 0; k < kAcc; ++k)
         storeF(lanes + kFloats * k, acc[k]);
     for (float v : lanes)
@@ -82,11 +86,14 @@ void addRowSum(const float* s, int width, double& total)
     for (; x < lanes.head; ++x)
         p[lanes.headLane + x] += tonemap::at(s, x);
     VF acc[kAcc];
+    #pragma GCC unroll 4
     for (int k = 0; k < kAcc; ++k)
         acc[k] = loadF(p + kFloats * k);
     for (; x + 16 <= width; x += 16)
+        #pragma GCC unroll 4
         for (int k = 0; k < kAcc; ++k)
             acc[k] = addF(acc[k], loadF(s + x + kFloats * k));
+    #pragma GCC unroll 4
     for (int k = 0; k < kAcc; ++k)
         storeF(p + kFloats * k, acc[k]);
     for (int i = 0; x < width; ++x, ++i)
