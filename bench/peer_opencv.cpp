@@ -11,16 +11,22 @@
 namespace zb {
 namespace {
 
-void registerCvtColor(const std::string& name, int code, const std::string& ours)
+void registerCvtColor(const std::string& name, int code, const std::string& ours, int type = CV_8UC3)
 {
+    const std::size_t sample = type == CV_32FC3 ? 4 : 1;
     for (Size size : kSizes) {
         const std::size_t px = static_cast<std::size_t>(size.width) * size.height;
-        registerPeer("OpenCV " + name, {ours}, size, px * 6, [code](Size s) -> Call {
-            auto src = std::make_shared<cv::Mat>(s.height, s.width, CV_8UC3);
-            const std::vector<uint8_t> bytes = randomBytes(std::size_t(s.width) * s.height * 3);
-            std::memcpy(src->data, bytes.data(), bytes.size());
+        registerPeer("OpenCV " + name, {ours}, size, px * 6 * sample, [code, type, sample](Size s) -> Call {
+            auto src = std::make_shared<cv::Mat>(s.height, s.width, type);
+            const std::size_t n = std::size_t(s.width) * s.height * 3;
+            const std::vector<uint8_t> bytes = randomBytes(n);
+            if (type == CV_32FC3)
+                for (std::size_t i = 0; i < n; ++i)
+                    reinterpret_cast<float*>(src->data)[i] = bytes[i] / 255.0f;
+            else
+                std::memcpy(src->data, bytes.data(), n * sample);
             // Allocated here with the size and type cvtColor asks for, so the timed call only converts.
-            auto dst = std::make_shared<cv::Mat>(s.height, s.width, CV_8UC3);
+            auto dst = std::make_shared<cv::Mat>(s.height, s.width, type);
             return [src, dst, code] { cv::cvtColor(*src, *dst, code); };
         });
     }
@@ -35,6 +41,10 @@ void registerOpenCVPeers()
     registerCvtColor("YUV2RGB", cv::COLOR_YUV2RGB, "zoxiYUVToRGB_8u_C3R");
     registerCvtColor("RGB2YCrCb", cv::COLOR_RGB2YCrCb, "zoxiRGBToYCbCr_8u_C3R");
     registerCvtColor("YCrCb2RGB", cv::COLOR_YCrCb2RGB, "zoxiYCbCrToRGB_8u_C3R");
+    registerCvtColor("RGB2XYZ", cv::COLOR_RGB2XYZ, "zoxiRGBToXYZ_8u_C3R");
+    registerCvtColor("XYZ2RGB", cv::COLOR_XYZ2RGB, "zoxiXYZToRGB_8u_C3R");
+    registerCvtColor("RGB2XYZ 32f", cv::COLOR_RGB2XYZ, "zoxiRGBToXYZ_32f_C3R", CV_32FC3);
+    registerCvtColor("XYZ2RGB 32f", cv::COLOR_XYZ2RGB, "zoxiXYZToRGB_32f_C3R", CV_32FC3);
 }
 } // namespace zb
 #else

@@ -255,6 +255,54 @@ ZOXCC_API zoxStatus zoxiYCoCgToSBGR_Rev_32s16s_P3C4R(const int32_t* const src[3]
 ZOXCC_API zoxStatus zoxiToneMapLinear_32f8u_C1R(const float* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
 ZOXCC_API zoxStatus zoxiToneMapMean_32f8u_C1R(const float* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
 
+/* ---- RGB <-> XYZ and RGB <-> YCC, 8u / 16u / 16s / 32f --------------------------------------------------
+ * XYZ: CIE XYZ by the single-precision matrices X = 0.412453 R + 0.35758 G + 0.180423 B, Y = 0.212671 R +
+ * 0.71516 G + 0.072169 B, Z = 0.019334 R + 0.119193 G + 0.950227 B, and their inverse. YCC: luma
+ * t = 0.299 R + 0.587 G + 0.114 B, Y = 0.7132668 t, C1 = 0.4368627 (B - t) and C2 = 0.5319216 (R - t)
+ * (0.53192 at 32f) with offsets 0.6117647 and 0.5372549 of full scale (156 and 137 at 8u, 40092 and
+ * 35209 at 16 bits); back: Y gain 1.3584, C1 to B 2.2179, C2 to R 1.8215, on G 0.194 of C1 and 0.509
+ * of C2. C3R: three channels, lowest address first (R,G,B / X,Y,Z / Y,C1,C2); AC4R: a fourth channel
+ * neither read for a value nor written, also in the destination. 8u: integer forms, block columns
+ * below the width rounded down to 8 (C3R) or 4 (AC4R), remainder columns in a whole-sample form that
+ * can differ by one unit. 16u/16s: single precision, sums left to right; 16s samples lifted by 32768
+ * and results limited to -32768..32767, 16u to 0..65535; block of 4 pixels, different from the
+ * remainder columns only in the YCC members (nearest against truncation). 32f: one form in all
+ * columns; XYZ limits only Z to 0..1, XYZToRGB and YCCToRGB limit each result to 0..1, RGBToYCC limits
+ * nothing. 16- and 32-bit members take their steps in whole samples, rounded down. Checks: src/dst
+ * null, then sizes. */
+ZOXCC_API zoxStatus zoxiRGBToXYZ_8u_C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToXYZ_8u_AC4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToXYZ_16u_C3R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToXYZ_16u_AC4R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToXYZ_16s_C3R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToXYZ_16s_AC4R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToXYZ_32f_C3R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToXYZ_32f_AC4R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiXYZToRGB_8u_C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiXYZToRGB_8u_AC4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiXYZToRGB_16u_C3R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiXYZToRGB_16u_AC4R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiXYZToRGB_16s_C3R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiXYZToRGB_16s_AC4R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiXYZToRGB_32f_C3R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiXYZToRGB_32f_AC4R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCC_8u_C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCC_8u_AC4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCC_16u_C3R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCC_16u_AC4R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCC_16s_C3R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCC_16s_AC4R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCC_32f_C3R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCC_32f_AC4R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCCToRGB_8u_C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCCToRGB_8u_AC4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCCToRGB_16u_C3R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCCToRGB_16u_AC4R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCCToRGB_16s_C3R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCCToRGB_16s_AC4R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCCToRGB_32f_C3R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCCToRGB_32f_AC4R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize);
+
 #ifdef __cplusplus
 }
 #endif

@@ -132,6 +132,13 @@ zoxStatus convert(typename C::Src::Arg src, int srcStep, typename C::Dst::Arg ds
     return zoxStatusOk;
 }
 
+// Steps rounded down to whole samples of the side's type (floor: -5 bytes of 16-bit samples are -6).
+template <class L>
+constexpr int wholeSampleStep(int step)
+{
+    return step & ~(static_cast<int>(sizeof(typename L::Sample)) - 1);
+}
+
 } // namespace zox
 
 // Export shapes of the generic layer. A family table row names one of these with the conversion's parts:
@@ -142,6 +149,13 @@ zoxStatus convert(typename C::Src::Arg src, int srcStep, typename C::Dst::Arg ds
     {                                                                                                       \
         return ::zox::convert<::zox::Conv<Src, Dst, N, Block, Rem, Chk>>(src, srcStep, dst, dstStep,      \
                                                                           roiSize, {});                    \
+    }
+// src, srcStep, dst, dstStep, roiSize; the steps taken in whole samples
+#define ZOX_SHAPE_SD_SAMPLES(name, Src, Dst, N, Block, Rem, Chk)                                          \
+    ZOXCC_API zoxStatus name(Src::Arg src, int srcStep, Dst::Arg dst, int dstStep, ImageSize roiSize)      \
+    {                                                                                                       \
+        return ::zox::convert<::zox::Conv<Src, Dst, N, Block, Rem, Chk>>(                                  \
+            src, ::zox::wholeSampleStep<Src>(srcStep), dst, ::zox::wholeSampleStep<Dst>(dstStep), roiSize, {}); \
     }
 // src, srcStep, dst, dstStep, roiSize, alpha (of the destination's sample type)
 #define ZOX_SHAPE_SD_ALPHA(name, Src, Dst, N, Block, Rem, Chk)                                            \

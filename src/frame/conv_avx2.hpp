@@ -52,7 +52,7 @@ inline void split(const V3& v, half::V3& lo, half::V3& hi)
 template <class C>
 void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx)
 {
-    if constexpr (compilerVectorised<typename C::Block>) {
+    if constexpr (compilerVectorised<typename C::Block> || (C::N > 1 && !groupWritable<typename C::Dst>())) {
         compiledBlocks<C>(s, d, n, ctx);
     } else if constexpr (C::N > 1) {
         using F = Simd<typename C::Block>;

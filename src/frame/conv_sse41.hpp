@@ -19,7 +19,7 @@ namespace zox::sse41 {
 template <class C>
 void blocks(const typename C::Src::Row& s, const typename C::Dst::Row& d, int n, const Ctx& ctx)
 {
-    if constexpr (compilerVectorised<typename C::Block>) {
+    if constexpr (compilerVectorised<typename C::Block> || (C::N > 1 && !groupWritable<typename C::Dst>())) {
         compiledBlocks<C>(s, d, n, ctx);
     } else if constexpr (C::N > 1) {
         using F = Simd<typename C::Block>;

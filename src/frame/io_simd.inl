@@ -38,7 +38,18 @@ inline constexpr int inputShift = inputShiftOf<Form>();
 template <class Form>
 inline constexpr bool compilerVectorised = requires { requires Form::compilerVectorised; };
 
-template <class C>
+// A destination the group writers serve: every layout but four-channel pixels whose fourth channel is
+// neither read nor written (rows into those run the compiler's vectorisation of the block form).
+template <class L>
+consteval bool groupWritable()
+{
+    if constexpr (requires { L::fourth; })
+        return L::fourth != Fourth::Keep;
+    else
+        return true;
+}
+
+template <class C, class Form = typename C::Block>
 [[gnu::flatten]] void compiledBlocks(const typename C::Src::Row& sRow, const typename C::Dst::Row& dRow, int n,
                                      const Ctx& ctxIn)
 {
@@ -46,7 +57,7 @@ template <class C>
     const typename C::Dst::Row d = dRow;
     const Ctx ctx = ctxIn;
     for (int x = 0; x < n; ++x)
-        C::Dst::store(d, x, C::Block::apply(C::Src::load(s, x)), ctx);
+        C::Dst::store(d, x, Form::apply(C::Src::load(s, x)), ctx);
 }
 
 // Readers and writers of sixteen pixels a lane: `a` holds pixels 0..7 of each lane's group, `b` 8..15.

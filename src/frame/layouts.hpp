@@ -6,15 +6,23 @@
 #include <cstddef>
 #include <cstdint>
 #include <cstring>
+#include <type_traits>
 
 namespace zox {
 
-// One pixel on its way through a form: three colour samples, and the fourth byte of a source that
-// carries one (an AC4 source feeding a fourth plane).
-struct Px {
-    int c[3];
+// One pixel on its way through a form: three colour samples (ints, or floats for float layouts), and
+// the fourth byte of a source that carries one (an AC4 source feeding a fourth plane).
+template <class V>
+struct PxOf {
+    V c[3];
     uint8_t extra;
 };
+using Px = PxOf<int>;
+using PxF = PxOf<float>;
+
+// The value type a sample of type T travels as.
+template <class T>
+using ValueOf = std::conditional_t<std::is_floating_point_v<T>, float, int>;
 
 // Per-call values a destination layout may need: the fourth channel's value, in the destination's
 // sample type.
@@ -46,10 +54,10 @@ constexpr int channelByte(Order o, int k)
     return o == Order::Rgb ? k : 2 - k;
 }
 
-// One sample of type T at byte address q, as an int; and an int stored as T (its low bits: an
-// unsigned or signed narrowing keeps the value modulo the type's range).
+// One sample of type T at byte address q, as its value type; and a value stored as T (an int keeps its
+// low bits: an unsigned or signed narrowing keeps the value modulo the type's range).
 template <class T>
-inline int loadSample(const uint8_t* q)
+inline ValueOf<T> loadSample(const uint8_t* q)
 {
     if constexpr (sizeof(T) == 1) {
         return static_cast<T>(*q);
@@ -60,7 +68,7 @@ inline int loadSample(const uint8_t* q)
     }
 }
 template <class T>
-inline void storeSample(uint8_t* q, int v)
+inline void storeSample(uint8_t* q, ValueOf<T> v)
 {
     const T t = static_cast<T>(v);
     if constexpr (sizeof(T) == 1)
@@ -72,6 +80,7 @@ inline void storeSample(uint8_t* q, int v)
 // Interleaved source: Ch samples a pixel (3, or 4 with a fourth 8-bit sample carried as `extra`).
 template <int Ch, Order O = Order::Rgb, class T = uint8_t>
 struct InPacked {
+    using Pixel = PxOf<ValueOf<T>>;
     static constexpr int planes = 1;
     static constexpr int channels = Ch;
     static constexpr int bytesPerPixel = Ch * static_cast<int>(sizeof(T));
@@ -83,11 +92,11 @@ struct InPacked {
     };
     static constexpr bool planesValid(Arg) { return true; }
     static Row row(Arg a, int step, int r) { return {{rowAddress(reinterpret_cast<const uint8_t*>(a), step, r)}}; }
-    static Px load(const Row& row, int x)
+    static Pixel load(const Row& row, int x)
     {
         constexpr int z = sizeof(T);
         const uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * bytesPerPixel;
-        Px px{{loadSample<T>(q + z * channelByte(O, 0)), loadSample<T>(q + z * channelByte(O, 1)),
+        Pixel px{{loadSample<T>(q + z * channelByte(O, 0)), loadSample<T>(q + z * channelByte(O, 1)),
                loadSample<T>(q + z * channelByte(O, 2))},
               0};
         if constexpr (Ch == 4 && z == 1)
@@ -99,6 +108,7 @@ struct InPacked {
 // Planar source: one plane a channel, in channel order.
 template <int P = 3, class T = uint8_t>
 struct InPlanar {
+    using Pixel = PxOf<ValueOf<T>>;
     static constexpr int planes = P;
     static constexpr int bytesPerPixel = static_cast<int>(sizeof(T));
     using Sample = T;
@@ -121,10 +131,10 @@ struct InPlanar {
             row.p[i] = rowAddress(reinterpret_cast<const uint8_t*>(a[i]), step, r);
         return row;
     }
-    static Px load(const Row& row, int x)
+    static Pixel load(const Row& row, int x)
     {
         const std::size_t at = static_cast<std::size_t>(x) * sizeof(T);
-        Px px{{loadSample<T>(row.p[0] + at), loadSample<T>(row.p[1] + at), loadSample<T>(row.p[2] + at)}, 0};
+        Pixel px{{loadSample<T>(row.p[0] + at), loadSample<T>(row.p[1] + at), loadSample<T>(row.p[2] + at)}, 0};
         if constexpr (P == 4)
             px.extra = row.p[3][x];
         return px;
@@ -134,6 +144,7 @@ struct InPlanar {
 // Interleaved destination; each sample is stored as T (8-bit ones arrive limited by clip8).
 template <int Ch, Order O, Fourth F, class T = uint8_t>
 struct OutPacked {
+    using Pixel = PxOf<ValueOf<T>>;
     static_assert((Ch == 3) == (F == Fourth::None));
     static constexpr int planes = 1;
     static constexpr int channels = Ch;
@@ -147,7 +158,7 @@ struct OutPacked {
     };
     static constexpr bool planesValid(Arg) { return true; }
     static Row row(Arg a, int step, int r) { return {{rowAddress(reinterpret_cast<uint8_t*>(a), step, r)}}; }
-    static void store(const Row& row, int x, const Px& px, const Ctx& ctx)
+    static void store(const Row& row, int x, const Pixel& px, const Ctx& ctx)
     {
         constexpr int z = sizeof(T);
         uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * bytesPerPixel;
@@ -155,9 +166,9 @@ struct OutPacked {
         for (int k = 0; k < 3; ++k)
             storeSample<T>(q + z * channelByte(O, k), px.c[k]);
         if constexpr (F == Fourth::Alpha)
-            storeSample<T>(q + 3 * z, ctx.alpha);
+            storeSample<T>(q + 3 * z, static_cast<ValueOf<T>>(ctx.alpha));
         else if constexpr (F == Fourth::Zero)
-            storeSample<T>(q + 3 * z, 0);
+            storeSample<T>(q + 3 * z, ValueOf<T>{0});
         else if constexpr (F == Fourth::Extra)
             q[3] = px.extra;
     }
@@ -166,6 +177,7 @@ struct OutPacked {
 // Planar destination; a fourth plane takes the source pixel's fourth byte.
 template <int P = 3, class T = uint8_t>
 struct OutPlanar {
+    using Pixel = PxOf<ValueOf<T>>;
     static constexpr int planes = P;
     static constexpr int bytesPerPixel = static_cast<int>(sizeof(T));
     using Sample = T;
@@ -188,7 +200,7 @@ struct OutPlanar {
             row.p[i] = rowAddress(reinterpret_cast<uint8_t*>(a[i]), step, r);
         return row;
     }
-    static void store(const Row& row, int x, const Px& px, const Ctx&)
+    static void store(const Row& row, int x, const Pixel& px, const Ctx&)
     {
         const std::size_t at = static_cast<std::size_t>(x) * sizeof(T);
         #pragma GCC unroll 3

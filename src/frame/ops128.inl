@@ -129,3 +129,6 @@ inline V sub8(V a, V b) { return _mm_sub_epi8(a, b); }
 inline V xor_(V a, V b) { return _mm_xor_si128(a, b); }
 // The bytes of b where the byte of m has its top bit set, else those of a.
 inline V selectByTopBit(V a, V b, V m) { return _mm_blendv_epi8(a, b, m); }
+
+// Pairs of 16-bit lanes multiplied and added into 32-bit lanes (pmaddwd).
+inline V madd16(V a, V b) { return _mm_madd_epi16(a, b); }

@@ -136,4 +136,6 @@ inline V sub8(V a, V b) { return _mm256_sub_epi8(a, b); }
 inline V xor_(V a, V b) { return _mm256_xor_si256(a, b); }
 inline V selectByTopBit(V a, V b, V m) { return _mm256_blendv_epi8(a, b, m); }
 
+inline V madd16(V a, V b) { return _mm256_madd_epi16(a, b); }
+
 } // namespace zox::avx2

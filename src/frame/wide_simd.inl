@@ -100,11 +100,15 @@ struct WideIo<OutPlanar<P>> {
 };
 
 // The whole-row kernel of a row with one form (N = 1): whole vectors from column 0; returns the
-// columns done, the rest being fewer than kWideLanes. Rows with a block form have none.
+// columns done, the rest being fewer than kWideLanes (a form the compiler vectorises does the whole
+// row). Rows with a block form have none.
 template <class C>
 int wideRow(const typename C::Src::Row& sRow, const typename C::Dst::Row& dRow, int width, const Ctx& ctx)
 {
-    if constexpr (C::N == 1) {
+    if constexpr (C::N == 1 && compilerVectorised<typename C::Rem>) {
+        compiledBlocks<C, typename C::Rem>(sRow, dRow, width, ctx);
+        return width;
+    } else if constexpr (C::N == 1) {
         using Src = typename C::Src;
         using Dst = typename C::Dst;
         const typename Src::Row s = sRow; // local copies: the stores cannot change them

@@ -97,6 +97,12 @@ void ycbcrDemo(Demo& d)
               {"y", "cb", "cr"});
 }
 
+void xyzDemo(Demo& d)
+{
+    roundTrip(d, "zoxiRGBToXYZ_8u_C3R", zoxiRGBToXYZ_8u_C3R, "zoxiXYZToRGB_8u_C3R", zoxiXYZToRGB_8u_C3R, "xyz", {"x", "y", "z"});
+    roundTrip(d, "zoxiRGBToYCC_8u_C3R", zoxiRGBToYCC_8u_C3R, "zoxiYCCToRGB_8u_C3R", zoxiYCCToRGB_8u_C3R, "ycc", {"y", "c1", "c2"});
+}
+
 void gammaDemo(Demo& d)
 {
     const Image& in = d.input();
@@ -198,6 +204,7 @@ const std::vector<FamilyDemo>& familyDemos()
     static const std::vector<FamilyDemo> demos = {
         {"RGB <-> YUV", yuvDemo},
         {"RGB <-> YCbCr", ycbcrDemo},
+        {"RGB <-> XYZ and YCC", xyzDemo},
         {"Gamma", gammaDemo},
         {"RGB <-> YCoCg", ycocgDemo},
         {"Tone mapping", toneMapDemo},

@@ -1,0 +1,9 @@
+// AVX2 kernels of the RGB <-> XYZ / YCC family: SIMD block forms at 8u, the others vectorised by the compiler.
+#include "frame/conv_avx2.hpp"
+#include "lumachroma/xyzycc_table.hpp"
+
+namespace zox::avx2 {
+#include "lumachroma/xyzycc_simd.inl"
+
+ZOX_XYZYCC_TABLE(ZOX_INSTANTIATE_KERNELS)
+} // namespace zox::avx2
