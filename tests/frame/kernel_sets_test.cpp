@@ -1,5 +1,4 @@
 // The kernel set a build runs: the choice made at load, and the separation of the sets' code.
-#include "core/cpu_features.hpp"
 #include "frame/byte_table.hpp"
 #include "frame/kernel_set.hpp"
 #include "support/conv_sweep.hpp"
@@ -28,22 +27,6 @@ TEST(KernelSets, ChoiceFromFeatureWord)
     for (const Row& r : rows)
         EXPECT_EQ(zox::kernelSetFor(r.word), r.want) << "word " << r.word;
 }
-
-// The "+" version record (feature 128 of the core services) names exactly the processors that run the
-// AVX2 kernels: on made-up registers, the decoded word gives both answers alike.
-TEST(KernelSets, PlusRecordMeansAvx2Kernels)
-{
-    using zox::core::CpuidWords;
-    const uint32_t avx = bit_SSE4_1 | bit_OSXSAVE | bit_AVX;
-    for (uint32_t ecx : {uint32_t{bit_SSE4_1}, avx, avx & ~bit_OSXSAVE, avx & ~bit_AVX})
-        for (uint32_t ebx7 : {0u, uint32_t{bit_AVX2}})
-            for (uint64_t xcr0 : {0x3ull, 0x7ull}) {
-                const uint64_t word = zox::core::featureWordOf(CpuidWords{ecx, bit_SSE2, ebx7, xcr0});
-                EXPECT_EQ(zox::kernelSetFor(word) == KernelSet::Avx2, (word & zoxCpuAvx2) != 0)
-                    << std::hex << ecx << " " << ebx7 << " " << xcr0;
-            }
-}
-
 TEST(KernelSets, ChosenSetMatchesProcessor)
 {
     KernelSet want = zox::kBuiltKernelSet;

@@ -2,22 +2,22 @@
 // pointers, with and without streaming stores; planes contiguous and padded, on both sides of the
 // streaming threshold, on the backward route; the guard bytes around every region.
 #include "frame/planes.hpp"
+#include "support/guarded.hpp"
 #include "support/test_core.hpp"
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <cstring>
-#include <random>
 #include <vector>
 
 namespace {
 
 std::vector<uint8_t> randomBytes(std::size_t n, unsigned seed)
 {
-    std::mt19937 rng(seed);
+    zt::Rng rng(seed);
     std::vector<uint8_t> v(n);
-    for (auto& b : v)
-        b = static_cast<uint8_t>(rng());
+    std::generate(v.begin(), v.end(), [&] { return static_cast<uint8_t>(rng()); });
     return v;
 }
 

@@ -8,7 +8,6 @@
 #include <gtest/gtest.h>
 
 #include <array>
-#include <cstdlib>
 #include <functional>
 #include <string>
 
@@ -167,28 +166,4 @@ TEST(YccExports, InverseRoundingAndSetPerColumn)
         EXPECT_EQ(row.block ? atBlock(e, row.in) : atRemainder(e, row.in), row.want)
             << row.in[0] << "," << row.in[1] << "," << row.in[2];
     }
-}
-
-// ---- block against remainder -------------------------------------------------------------------------
-
-TEST(YccForms, BlockAndRemainderWithinOne)
-{
-    const struct {
-        const char* name;
-        Form block, rem;
-    } pairs[] = {
-        {"RGBToYCbCr C3R", &YccFromRgbRound::apply, &YccFromRgbPixel::apply},
-        {"RGBToYCbCr matrix", &YccFromRgbMatrix::apply, &YccFromRgbPixel::apply},
-        {"YCbCrToRGB C3R", &RgbFromYccBlockARounded::apply, &RgbFromYccPixelATruncated::apply},
-        {"YCbCrToRGB P3R", &RgbFromYccBlockATruncated::apply, &RgbFromYccPixelARounded::apply},
-        {"YCbCrToRGB P3C3R", &RgbFromYccBlockBSum::apply, &RgbFromYccPixelBTruncated::apply},
-        {"YCbCrToRGB P3C4R", &RgbFromYccBlockBDifference::apply, &RgbFromYccPixelBRounded::apply},
-    };
-    for (const auto& pair : pairs)
-        for (int i = 0; i < (1 << 24); i += 7) {
-            const Triple in{i >> 16, (i >> 8) & 255, i & 255};
-            const Triple a = run(pair.block, in), b = run(pair.rem, in);
-            for (int k = 0; k < 3; ++k)
-                ASSERT_LE(std::abs(a[k] - b[k]), 1) << pair.name << " input " << in[0] << "," << in[1] << "," << in[2];
-        }
 }

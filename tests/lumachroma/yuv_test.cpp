@@ -77,25 +77,3 @@ TEST(YuvForms, GrayStaysGrayInEveryInverseForm)
             ASSERT_EQ(got, gray) << "Y " << y;
     }
 }
-
-// Block and remainder form of one export differ by at most one unit in each channel.
-template <class Block, class Rem>
-void expectWithinOne(const char* what)
-{
-    for (int i = 0; i < (1 << 24); i += 7) {
-        const Triple in{i >> 16, (i >> 8) & 255, i & 255};
-        const Triple a = run<Block>(in), b = run<Rem>(in);
-        for (int k = 0; k < 3; ++k)
-            ASSERT_LE(std::abs(a[k] - b[k]), 1) << what << " input " << in[0] << "," << in[1] << "," << in[2];
-    }
-}
-
-TEST(YuvForms, BlockAndRemainderWithinOne)
-{
-    expectWithinOne<YuvFromRgbMatrix, YuvFromRgbDifferenceLow>("RGBToYUV C3R");
-    expectWithinOne<YuvFromRgbHalf, YuvFromRgbDifferenceFull>("RGBToYUV AC4P4R");
-    expectWithinOne<YuvFromRgbMatrix, YuvFromRgbPlane>("RGBToYUV P3R");
-    expectWithinOne<RgbFromYuvBlock8, RgbFromYuvRoundedGreenLow>("YUVToRGB C3R");
-    expectWithinOne<RgbFromYuvBlock128, RgbFromYuvRounded>("YUVToRGB C3C4R");
-    expectWithinOne<RgbFromYuvBlock16, RgbFromYuvTruncated>("YUVToRGB P3C3R");
-}
