@@ -149,6 +149,73 @@ ZOXCC_API zoxStatus zoxiYCbCrToBGR_8u_P3C4R(const uint8_t* const src[3], int src
 ZOXCC_API zoxStatus zoxiYCbCrToBGR_709CSC_8u_P3C3R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
 ZOXCC_API zoxStatus zoxiYCbCrToBGR_709CSC_8u_P3C4R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
 
+/* ---- RGB to chroma-sampled YCbCr and YUV, 8u: 4:2:0, 4:2:2, 4:1:1 --------------------------------------
+ * roiSize counts luma pixels. Chroma comes from the sums of each channel over a unit (4:2:0: 2x2 pixels,
+ * 4:2:2: 2x1, 4:1:1: 4x1); the CbYCr422 RGB members filter with taps 1/4, 1/2, 1/4 instead (the first
+ * pair of a row has no left neighbour), the Gamma one after the BT.709 forward table. BGR names read B,G,R;
+ * C4 and AC4 sources leave the fourth byte unread.
+ * Layouts: P3 three planes Y, Cb, Cr (YCrCb names: Y, Cr, Cb, with dstStep in the same order); chroma
+ * planes 4:2:0 width/2 x height/2, 4:2:2 width/2 x height, 4:1:1 width/4 x height. P2: Y, then Cb,Cr pairs.
+ * C2: 4 bytes for 2 pixels, YCbCr422 and YUV422 Y0 Cb Y1 Cr, YCrCb422 Y0 Cr Y1 Cb, CbYCr422 Cb Y0 Cr Y1.
+ * Matrix and range: YUV full range (BT.601 analogue weights); YCbCr studio range BT.601, 709CSC studio
+ * BT.709, 709HDTV full-range BT.709 with every sample held to 1..254.
+ * Each member's block form runs on the units that start before its limit column and a remainder form
+ * on the rest (values differ by a unit at most).
+ * Odd sizes: 4:2:0 converts whole 2x2 units only; a last odd row and column are left untouched, and a
+ * region one pixel wide or high writes nothing. 4:2:2 last odd pixel: YUV422 C3C2R Y and U; YUV422 P3
+ * forms Y, U, V; BGRToYCbCr422 C2R Y and Cb, P3R Y only; RGBToYCbCr422 C3P3R nothing; RGBToYCbCr422 and
+ * RGBToYCrCb422 C2R Y and its group's second byte; CbYCr422 Cb and Y. 4:1:1: BGRToYCbCr411 AC4P3R gives
+ * the up to 3 pixels behind the last unit luma only, C3P3R nothing.
+ * Without R: packed planes, source rows of width pixels, destination steps width and width/2 (4:2:2:
+ * width/2 rounded up); a 4:2:2 image of even width and 256 pixels or more is converted as one row.
+ * RGBToYUV422_8u_C3P3R: rows whose four pointers and steps are multiples of 16 take their own forms.
+ * Minimum sizes: BGRToYCbCr420/BGRToYCrCb420 (all) and RGBToYCrCb420 2x2, 4:1:1 width 4, RGBToYCbCr422
+ * C3P3R and BGRToYCbCr422 width 2, others 1x1. zoxWarnOddSize with the finished result: 4:2:0 width or
+ * height odd; 4:1:1 width not a multiple of 4; RGBToYCbCr422_8u_C3P3R width odd.
+ * Checks: every pointer (array elements included), then sizes; RGBToYUV420, RGBToYUV422,
+ * BGRToYUV420_AC4P3R, RGBToYCbCr420_8u_C3P3R and the two P3C2R members: src and dst, sizes, then the
+ * array elements. Steps are not examined. */
+ZOXCC_API zoxStatus zoxiRGBToYUV420_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYUV420_8u_C3P3(const uint8_t* src, uint8_t* const dst[3], ImageSize imageSize);
+ZOXCC_API zoxStatus zoxiRGBToYUV420_8u_P3R(const uint8_t* const src[3], int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYUV420_8u_P3(const uint8_t* const src[3], uint8_t* const dst[3], ImageSize imageSize);
+ZOXCC_API zoxStatus zoxiBGRToYUV420_8u_AC4P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCbCr420_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCbCr420_8u_C3P2R(const uint8_t* src, int srcStep, uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCbCr420_8u_C4P2R(const uint8_t* src, int srcStep, uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCbCr420_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCbCr420_8u_AC4P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCrCb420_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCrCb420_8u_AC4P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCrCb420_8u_AC4P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCbCr420_709CSC_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCbCr420_709CSC_8u_AC4P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCrCb420_709CSC_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCrCb420_709CSC_8u_AC4P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCbCr420_709CSC_8u_C3P2R(const uint8_t* src, int srcStep, uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCbCr420_709HDTV_8u_AC4P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCbCr411_8u_AC4P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCbCr411_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYUV422_8u_C3C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYUV422_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYUV422_8u_C3P3(const uint8_t* src, uint8_t* const dst[3], ImageSize imageSize);
+ZOXCC_API zoxStatus zoxiRGBToYUV422_8u_P3R(const uint8_t* const src[3], int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYUV422_8u_P3(const uint8_t* const src[3], uint8_t* const dst[3], ImageSize imageSize);
+ZOXCC_API zoxStatus zoxiBGRToYCbCr422_8u_C3C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCbCr422_8u_AC4C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCbCr422_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToYCbCr422_8u_AC4P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCbCr422_8u_C3P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCbCr422_8u_C3C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCbCr422_8u_P3C2R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCrCb422_8u_C3C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToYCrCb422_8u_P3C2R(const uint8_t* const src[3], int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToCbYCr422_8u_AC4C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToCbYCr422_709HDTV_8u_AC4C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToCbYCr422_709HDTV_8u_C3C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToCbYCr422_8u_C3C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToCbYCr422Gamma_8u_C3C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+
 /* ---- Gamma correction, 8u / 16u / 32f ----------------------------------------------------------------
  * The BT.709 transfer curve, forward (linear to encoded) or inverse, on every colour sample. 8u reads a
  * constant table; 16u evaluates the curve in double precision per sample, or through a 65536-entry table

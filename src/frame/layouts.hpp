@@ -44,9 +44,9 @@ enum class Fourth {
 
 // Address of row r: computed in 64 bits so that no width, height or step product wraps.
 template <class T>
-constexpr T* rowAddress(T* base, int step, int r)
+constexpr T* rowAddress(T* base, std::ptrdiff_t step, int r)
 {
-    return reinterpret_cast<T*>(reinterpret_cast<uintptr_t>(base) + static_cast<intptr_t>(r) * step);
+    return reinterpret_cast<T*>(reinterpret_cast<uintptr_t>(base) + static_cast<intptr_t>(r) * static_cast<intptr_t>(step));
 }
 
 constexpr int channelByte(Order o, int k)
@@ -91,7 +91,7 @@ struct InPacked {
         const uint8_t* p[1];
     };
     static constexpr bool planesValid(Arg) { return true; }
-    static Row row(Arg a, int step, int r) { return {{rowAddress(reinterpret_cast<const uint8_t*>(a), step, r)}}; }
+    static Row row(Arg a, std::ptrdiff_t step, int r) { return {{rowAddress(reinterpret_cast<const uint8_t*>(a), step, r)}}; }
     static Pixel load(const Row& row, int x)
     {
         constexpr int z = sizeof(T);
@@ -123,7 +123,7 @@ struct InPlanar {
                 return false;
         return true;
     }
-    static Row row(Arg a, int step, int r)
+    static Row row(Arg a, std::ptrdiff_t step, int r)
     {
         Row row;
         #pragma GCC unroll 4
@@ -157,7 +157,7 @@ struct OutPacked {
         uint8_t* p[1];
     };
     static constexpr bool planesValid(Arg) { return true; }
-    static Row row(Arg a, int step, int r) { return {{rowAddress(reinterpret_cast<uint8_t*>(a), step, r)}}; }
+    static Row row(Arg a, std::ptrdiff_t step, int r) { return {{rowAddress(reinterpret_cast<uint8_t*>(a), step, r)}}; }
     static void store(const Row& row, int x, const Pixel& px, const Ctx& ctx)
     {
         constexpr int z = sizeof(T);
@@ -192,7 +192,7 @@ struct OutPlanar {
                 return false;
         return true;
     }
-    static Row row(Arg a, int step, int r)
+    static Row row(Arg a, std::ptrdiff_t step, int r)
     {
         Row row;
         #pragma GCC unroll 4

@@ -30,4 +30,10 @@ constexpr uint8_t clip8(int x)
     return static_cast<uint8_t>(x < 0 ? 0 : (x > 255 ? 255 : x));
 }
 
+// Holds x to 1..254: the limit of the full-range sampled sets.
+constexpr uint8_t limit1(int x)
+{
+    return static_cast<uint8_t>(x < 1 ? 1 : (x > 254 ? 254 : x));
+}
+
 } // namespace zox

@@ -132,3 +132,11 @@ inline V selectByTopBit(V a, V b, V m) { return _mm_blendv_epi8(a, b, m); }
 
 // Pairs of 16-bit lanes multiplied and added into 32-bit lanes (pmaddwd).
 inline V madd16(V a, V b) { return _mm_madd_epi16(a, b); }
+
+// Sampled images: sums of neighbouring 16-bit lanes (wrapping), the 8-byte halves of each lane stored on
+// their own (the next lane's g bytes on), and 16-bit limits.
+inline V hadd(V a, V b) { return _mm_hadd_epi16(a, b); }
+inline void storeLowHalves(uint8_t* q, std::size_t, V v) { _mm_storel_epi64(reinterpret_cast<V*>(q), v); }
+inline void storeHighHalves(uint8_t* q, std::size_t, V v) { _mm_storeh_pd(reinterpret_cast<double*>(q), _mm_castsi128_pd(v)); }
+inline V min16(V a, V b) { return _mm_min_epi16(a, b); }
+inline V max16(V a, V b) { return _mm_max_epi16(a, b); }

@@ -138,4 +138,20 @@ inline V selectByTopBit(V a, V b, V m) { return _mm256_blendv_epi8(a, b, m); }
 
 inline V madd16(V a, V b) { return _mm256_madd_epi16(a, b); }
 
+// Sampled images: sums of neighbouring 16-bit lanes within each 128-bit lane (wrapping), the 8-byte
+// halves of each 128-bit lane stored on their own (the upper lane's g bytes on), and 16-bit limits.
+inline V hadd(V a, V b) { return _mm256_hadd_epi16(a, b); }
+inline void storeLowHalves(uint8_t* q, std::size_t g, V v)
+{
+    _mm_storel_epi64(reinterpret_cast<__m128i*>(q), _mm256_castsi256_si128(v));
+    _mm_storel_epi64(reinterpret_cast<__m128i*>(q + g), _mm256_extracti128_si256(v, 1));
+}
+inline void storeHighHalves(uint8_t* q, std::size_t g, V v)
+{
+    _mm_storeh_pd(reinterpret_cast<double*>(q), _mm_castsi128_pd(_mm256_castsi256_si128(v)));
+    _mm_storeh_pd(reinterpret_cast<double*>(q + g), _mm_castsi128_pd(_mm256_extracti128_si256(v, 1)));
+}
+inline V min16(V a, V b) { return _mm256_min_epi16(a, b); }
+inline V max16(V a, V b) { return _mm256_max_epi16(a, b); }
+
 } // namespace zox::avx2

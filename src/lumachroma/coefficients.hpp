@@ -42,6 +42,7 @@ struct YccForwardGains {
     int yR, yG, yB;
     int cbR, cbG, cbB;
     int crR, crG, crB;
+    bool full = false; // full-range luma: every sample held to 1..254
 };
 // Forward weights as magnitudes: the forms that use such a set put the minus signs themselves (Cb
 // subtracts its R and G terms, Cr its G and B terms), because a rounded product of a negated gain is
@@ -50,9 +51,18 @@ struct YccForwardMagnitudes {
     int yR, yG, yB;
     int cbR, cbG, cbB;
     int crR, crG, crB;
+    bool full = false; // full-range luma: every sample held to 1..254
 };
 // BT.601 weights in 1/65536.
 inline constexpr YccForwardGains YccForward{16843, 33030, 6423, -9699, -19071, 28770, 28770, -24117, -4653};
+// The whole-sample sets of the sampled BT.709 members, in 1/65536: studio range, and full-range luma.
+inline constexpr YccForwardGains YccPixel709{11993, 40239, 4063, -6619, -22151, 28770, 28770, -26149, -2621};
+inline constexpr YccForwardGains YccPixel709Full{13959, 46858, 4719, -7668, -25821, 33489, 33489, -30409, -3080, true};
+// The block sets of the sampled members: luma in 1/32768 on 256 x sample, chroma as magnitudes (Cb
+// subtracts its R and G terms, Cr its G and B terms) on sums of a unit's samples.
+inline constexpr YccForwardMagnitudes YccSum601{8422, 16515, 3212, 9699, 19071, 28770, 28770, 24117, 4653};
+inline constexpr YccForwardMagnitudes YccSum709{5997, 20120, 2032, 6619, 22151, 28770, 28770, 26149, 2621};
+inline constexpr YccForwardMagnitudes YccSum709Full{6980, 23429, 2359, 3834, 12911, 16744, 16744, 15204, 1540, true};
 // BT.601 weights in 1/16384, for rounded multiplies of 128 x sample.
 inline constexpr YccForwardMagnitudes YccForwardRound{4211, 8258, 1606, 2425, 4768, 7193, 7193, 6029, 1163};
 
