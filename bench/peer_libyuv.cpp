@@ -5,6 +5,8 @@
 #if defined(ZOX_BENCH_LIBYUV)
 #include <libyuv.h>
 
+#include <string>
+
 namespace zb {
 namespace {
 
@@ -20,10 +22,51 @@ struct Planes {
     uint8_t* operator[](int p) { return bytes.data() + p * plane; }
 };
 
+
+// One sampled conversion of libyuv from a packed source of `bpp` bytes a pixel.
+void samplePeer(const char* name, std::vector<std::string> ours, Size size, int bpp, std::size_t outBytes,
+                void (*call)(const uint8_t*, int, uint8_t*, Size))
+{
+    const std::size_t px = static_cast<std::size_t>(size.width) * size.height;
+    registerPeer(name, ours, size, px * bpp + outBytes, [bpp, outBytes, call](Size s) -> Call {
+        auto in = std::make_shared<std::vector<uint8_t>>(randomBytes(std::size_t(s.width) * s.height * bpp));
+        auto out = std::make_shared<std::vector<uint8_t>>(outBytes + 64);
+        return [in, out, s, bpp, call] { call(in->data(), s.width * bpp, out->data(), s); };
+    });
+}
+
 } // namespace
 
 void registerLibyuvPeers()
 {
+    // The SSE4.1-only build is timed against libyuv held to the same generation of instructions.
+    if (std::string(ZOX_BENCH_ISA) == "sse41")
+        libyuv::MaskCpuFlags(libyuv::kCpuHasX86 | libyuv::kCpuHasSSE2 | libyuv::kCpuHasSSSE3 | libyuv::kCpuHasSSE41 |
+                             libyuv::kCpuHasSSE42);
+    for (Size size : kSizes) {
+        const std::size_t q = static_cast<std::size_t>(size.width / 2) * (size.height / 2);
+        const std::size_t luma = static_cast<std::size_t>(size.width) * size.height;
+        // 4:2:0 planes, two rows at a time: I420 (three planes) and NV12 (Y and pairs) out.
+        samplePeer("libyuv RGB24ToI420", {"zoxiRGBToYCbCr420_8u_C3P3R", "zoxiRGBToYUV420_8u_C3P3R"}, size, 3, luma + 2 * q,
+                   [](const uint8_t* in, int step, uint8_t* o, Size s) {
+                       const int w = s.width, h = s.height;
+                       libyuv::RGB24ToI420(in, step, o, w, o + w * h, w / 2, o + w * h + w / 2 * (h / 2), w / 2, w, h);
+                   });
+        samplePeer("libyuv ARGBToI420", {"zoxiBGRToYCbCr420_8u_AC4P3R"}, size, 4, luma + 2 * q,
+                   [](const uint8_t* in, int step, uint8_t* o, Size s) {
+                       const int w = s.width, h = s.height;
+                       libyuv::ARGBToI420(in, step, o, w, o + w * h, w / 2, o + w * h + w / 2 * (h / 2), w / 2, w, h);
+                   });
+        samplePeer("libyuv ARGBToNV12", {"zoxiRGBToYCbCr420_8u_C3P2R"}, size, 4, luma + 2 * q,
+                   [](const uint8_t* in, int step, uint8_t* o, Size s) {
+                       const int w = s.width, h = s.height;
+                       libyuv::ARGBToNV12(in, step, o, w, o + w * h, w, w, h);
+                   });
+        samplePeer("libyuv ARGBToYUY2", {"zoxiRGBToYCbCr422_8u_C3C2R"}, size, 4, 2 * luma,
+                   [](const uint8_t* in, int step, uint8_t* o, Size s) {
+                       libyuv::ARGBToYUY2(in, step, o, s.width * 2, s.width, s.height);
+                   });
+    }
     for (Size size : kSizes) {
         const std::size_t px = static_cast<std::size_t>(size.width) * size.height;
         // 4:4:4 planes from ARGB (4 bytes in, 3 out).

@@ -1,6 +1,7 @@
 // The one list of what the benchmark program registers.
 namespace zb {
 void registerConvFamilies();
+void registerSampledFamilies();
 void registerGammaFamily();
 void registerPlanesAndToneMaps();
 void registerLibyuvPeers();
@@ -9,6 +10,7 @@ void registerOpenCVPeers();
 void registerAll()
 {
     registerConvFamilies();
+    registerSampledFamilies();
     registerGammaFamily();
     registerPlanesAndToneMaps();
     registerLibyuvPeers();

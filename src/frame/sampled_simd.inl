@@ -3,9 +3,11 @@
 // each sampled destination, and the kernel that runs them over whole groups of sixteen pixels a lane
 // (eight units of 2 x 1 or 2 x 2).
 
-// A family's block form over the units of one group: a[r], b[r] hold pixels 0..7 and 8..15 of source row
-// r (samples in the low byte of 16-bit lanes); the form gives each row's luma (y[r][0] for a, y[r][1]
-// for b) and the eight units' Cb and Cr in 16-bit lanes, all before clip8. `rows` is its unit height.
+// A family's block form over vectors, in two parts so that a row's pixels are done with before the next
+// row is read: `luma(v)` gives a luma term of each pixel of v (samples in the low byte of 16-bit lanes)
+// and `lumaOut(t)` its Y before clip8; `chroma(sums, lumaSums, cb, cr)` gives the units' Cb and Cr from
+// the channel sums of each unit and, where the form declares `lumaSums`, the sums of the luma terms.
+// `rows` is its unit height.
 template <class Form>
 struct SimdUnit;
 
@@ -18,19 +20,13 @@ consteval int simdUnitRows()
         return 0;
 }
 
-// The channel sums of each unit of a group: pairs of neighbouring lanes, over one or two rows.
-template <int Rows>
-inline V3 unitSums(const V3* a, const V3* b)
+template <class Form>
+consteval bool simdLumaSums()
 {
-    V3 s;
-    #pragma GCC unroll 3
-    for (int k = 0; k < 3; ++k) {
-        s.c[k] = hadd(a[0].c[k], b[0].c[k]);
-        if constexpr (Rows == 2)
-            s.c[k] = add(s.c[k], hadd(a[1].c[k], b[1].c[k]));
-    }
-    s.extra = zero();
-    return s;
+    if constexpr (requires { SimdUnit<Form>::lumaSums; })
+        return SimdUnit<Form>::lumaSums;
+    else
+        return false;
 }
 
 // Units' first and second chroma bytes interleaved: c0 c1 c0 c1 ... from a register of eight c0 then
@@ -40,14 +36,12 @@ inline constexpr Bytes16 kPairUp{{0, 8, 1, 9, 2, 10, 3, 11, 4, 12, 5, 13, 6, 14,
 template <class Dst>
 struct SampledGroupOut;
 
+// Writers: `luma` stores the sixteen lumas a lane of row r (as bytes), `chroma` the units' pairs.
 template <Sampling S>
 struct SampledGroupOut<OutSampledP3<S>> {
-    template <int Rows>
-    static void put(const SampledPass& d, int x, int u, const V (&y)[2][2], V cb, V cr)
+    static void luma(const SampledPass& d, int r, int x, V y) { storeLanes(d.y[r] + x, 16, y); }
+    static void chroma(const SampledPass& d, int, int u, V cb, V cr, V)
     {
-        #pragma GCC unroll 2
-        for (int r = 0; r < Rows; ++r)
-            storeLanes(d.y[r] + x, 16, packUs(y[r][0], y[r][1]));
         const V c = packUs(cb, cr);
         storeLowHalves(d.c0 + u, 8, c);
         storeHighHalves(d.c1 + u, 8, c);
@@ -56,23 +50,20 @@ struct SampledGroupOut<OutSampledP3<S>> {
 
 template <Sampling S>
 struct SampledGroupOut<OutSampledP2<S>> {
-    template <int Rows>
-    static void put(const SampledPass& d, int x, int u, const V (&y)[2][2], V cb, V cr)
+    static void luma(const SampledPass& d, int r, int x, V y) { storeLanes(d.y[r] + x, 16, y); }
+    static void chroma(const SampledPass& d, int, int u, V cb, V cr, V)
     {
-        #pragma GCC unroll 2
-        for (int r = 0; r < Rows; ++r)
-            storeLanes(d.y[r] + x, 16, packUs(y[r][0], y[r][1]));
         storeLanes(d.c0 + 2 * static_cast<std::size_t>(u), 16, shuffle(packUs(cb, cr), maskOf(kPairUp)));
     }
 };
 
 template <const GroupOrder& G>
 struct SampledGroupOut<OutSampledC2<G>> {
-    template <int Rows>
-    static void put(const SampledPass& d, int x, int, const V (&y)[2][2], V cb, V cr)
+    // The lumas go out with the chroma, in one pass over the group's bytes.
+    static void luma(const SampledPass&, int, int, V) {}
+    static void chroma(const SampledPass& d, int x, int, V cb, V cr, V luma)
     {
         const bool crFirst = G.cr < G.cb;
-        const V luma = packUs(y[0][0], y[0][1]);
         const V pairs = shuffle(crFirst ? packUs(cr, cb) : packUs(cb, cr), maskOf(kPairUp));
         uint8_t* q = d.y[0] + 2 * static_cast<std::size_t>(x);
         if constexpr (G.y0 == 0) {
@@ -85,25 +76,38 @@ struct SampledGroupOut<OutSampledC2<G>> {
     }
 };
 
-// The block form over whole groups of units [u, n) of a pass; returns the first unit not done.
+// The block form over whole groups of units [u, n) of a pass; returns the first unit not done. Each
+// row's lumas are stored as soon as they are formed; the channel sums of its units (pairs of
+// neighbouring lanes) are carried to the chroma.
 template <class C>
 int sampledGroups(const SourcePass<typename C::Src>& sIn, const SampledPass& dIn, int u, int n)
 {
-    using F = typename C::Block;
-    constexpr int rows = simdUnitRows<F>();
+    using F = SimdUnit<typename C::Block>;
+    using Out = SampledGroupOut<typename C::Dst>;
+    constexpr int rows = simdUnitRows<typename C::Block>();
     if constexpr (C::variant != 2 && rows == C::uh && C::uw == 2) {
         const SourcePass<typename C::Src> s = sIn;
         const SampledPass d = dIn;
         constexpr int per = kGroupPixels / 2;
         for (; u + per <= n; u += per) {
             const int x = 2 * u;
-            V3 a[2], b[2];
+            V sum[3], lumaSum = zero(), y = zero();
             #pragma GCC unroll 2
-            for (int r = 0; r < rows; ++r)
-                GroupIo<typename C::Src>::template get<0>(s.r[r], x, a[r], b[r]);
-            V y[2][2], cb, cr;
-            SimdUnit<F>::apply(a, b, y, cb, cr);
-            SampledGroupOut<typename C::Dst>::template put<rows>(d, x, u, y, cb, cr);
+            for (int r = 0; r < rows; ++r) {
+                V3 a, b;
+                GroupIo<typename C::Src>::template get<0>(s.r[r], x, a, b);
+                const V ta = F::luma(a), tb = F::luma(b);
+                y = packUs(F::lumaOut(ta), F::lumaOut(tb));
+                Out::luma(d, r, x, y);
+                if constexpr (simdLumaSums<typename C::Block>())
+                    lumaSum = r == 0 ? hadd(ta, tb) : add(lumaSum, hadd(ta, tb));
+                #pragma GCC unroll 3
+                for (int k = 0; k < 3; ++k)
+                    sum[k] = r == 0 ? hadd(a.c[k], b.c[k]) : add(sum[k], hadd(a.c[k], b.c[k]));
+            }
+            V cb, cr;
+            F::chroma(V3{{sum[0], sum[1], sum[2]}, zero()}, lumaSum, cb, cr);
+            Out::chroma(d, x, u, cb, cr, y);
         }
     }
     return u;

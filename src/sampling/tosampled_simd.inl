@@ -1,8 +1,8 @@
-// RGB to chroma-sampled images: the block forms over the units of one group, in 16-bit lanes (the 32-bit
-// sums of the Mixed chroma through pair multiply-adds). Included inside the namespace of each instruction
-// set after its vocabulary and the sampled kernel: one definition for every flavour.
+// RGB to chroma-sampled images: the block forms over vectors, in 16-bit lanes (the 32-bit sums of the
+// Mixed chroma through pair multiply-adds). Included inside the namespace of each instruction set after
+// its vocabulary and the sampled kernel: one definition for every flavour.
 
-// Luma through rounded products of 128 x sample (Round and R420 forms).
+// Luma terms through rounded products of 128 x sample (Round and R420 forms).
 template <int kr, int kg, int kb>
 inline V roundedLuma(const V3& v)
 {
@@ -14,13 +14,10 @@ template <>
 struct SimdUnit<YccRoundBlock<false>> {
     static constexpr int rows = 2;
     static constexpr YccForwardMagnitudes K = YccForwardRound;
-    static void apply(const V3* a, const V3* b, V (&y)[2][2], V& cb, V& cr)
+    static V luma(const V3& v) { return roundedLuma<K.yR, K.yG, K.yB>(v); }
+    static V lumaOut(V t) { return shr<6>(add(t, splat16<1026>())); }
+    static void chroma(const V3& s, V, V& cb, V& cr)
     {
-        for (int r = 0; r < 2; ++r) {
-            y[r][0] = shr<6>(add(roundedLuma<K.yR, K.yG, K.yB>(a[r]), splat16<1026>()));
-            y[r][1] = shr<6>(add(roundedLuma<K.yR, K.yG, K.yB>(b[r]), splat16<1026>()));
-        }
-        const V3 s = unitSums<2>(a, b);
         const V sr = shl<5>(s.c[0]), sg = shl<5>(s.c[1]), sb = shl<5>(s.c[2]);
         cb = shr<6>(sub(sub(add(mulRound(sb, splat16<K.cbB>()), splat16<8194>()), mulRound(sg, splat16<K.cbG>())),
                         mulRound(sr, splat16<K.cbR>())));
@@ -32,18 +29,13 @@ struct SimdUnit<YccRoundBlock<false>> {
 template <>
 struct SimdUnit<YuvR420Block> {
     static constexpr int rows = 2;
-    static void apply(const V3* a, const V3* b, V (&y)[2][2], V& cb, V& cr)
+    static constexpr bool lumaSums = true;
+    static V luma(const V3& v) { return roundedLuma<4899, 9617, 1868>(v); }
+    static V lumaOut(V t) { return shr<6>(t); }
+    // The four luma terms of a unit reach 65284: their sum wraps into the unsigned range, halved logically.
+    static void chroma(const V3& s, V t, V& cb, V& cr)
     {
-        V t[2][2];
-        for (int r = 0; r < 2; ++r) {
-            t[r][0] = roundedLuma<4899, 9617, 1868>(a[r]);
-            t[r][1] = roundedLuma<4899, 9617, 1868>(b[r]);
-            y[r][0] = shr<6>(t[r][0]);
-            y[r][1] = shr<6>(t[r][1]);
-        }
-        // The four lumas of a unit reach 65284: their sum wraps into the unsigned range, halved logically.
-        const V h = shrU<1>(add(hadd(t[0][0], t[0][1]), hadd(t[1][0], t[1][1])));
-        const V3 s = unitSums<2>(a, b);
+        const V h = shrU<1>(t);
         cb = add(shr<6>(mulRound(sub(shl<5>(s.c[2]), h), splat16<8061>())), splat16<128>());
         cr = add(shr<6>(mulRound(sub(shl<5>(s.c[0]), h), splat16<14369>())), splat16<128>());
     }
@@ -52,23 +44,17 @@ struct SimdUnit<YuvR420Block> {
 template <>
 struct SimdUnit<YuvH420Block> {
     static constexpr int rows = 2;
+    static constexpr bool lumaSums = true;
     using K = YuvHalfForward;
     static V luma(const V3& v)
     {
         return add(add(mulHigh(shl<2>(v.c[0]), splat16<K::yR>()), mulHigh(shl<2>(v.c[2]), splat16<K::yB>())),
                    mulHigh(shl<2>(v.c[1]), splat16<K::yG>()));
     }
-    static void apply(const V3* a, const V3* b, V (&y)[2][2], V& cb, V& cr)
+    static V lumaOut(V t) { return shr<1>(t); }
+    static void chroma(const V3& s, V t, V& cb, V& cr)
     {
-        V t[2][2];
-        for (int r = 0; r < 2; ++r) {
-            t[r][0] = luma(a[r]);
-            t[r][1] = luma(b[r]);
-            y[r][0] = shr<1>(t[r][0]);
-            y[r][1] = shr<1>(t[r][1]);
-        }
-        const V q = shr<2>(add(hadd(t[0][0], t[0][1]), hadd(t[1][0], t[1][1])));
-        const V3 s = unitSums<2>(a, b);
+        const V q = shr<2>(t);
         cb = add(mulHigh(sub(shr<1>(s.c[2]), q), splat16<K::uGain>()), splat16<128>());
         cr = add(mulHigh(sub(shr<1>(s.c[0]), q), splat16<K::vGain>()), splat16<128>());
     }
@@ -91,17 +77,13 @@ struct SimdUnit<YccSumBlock<K, Kind>> {
     static V luma(const V3& v)
     {
         constexpr int c = K.full ? 64 : 2112;
-        return limitLanes<K.full>(shr<7>(add(add(add(mulHighU(shl<8>(v.c[0]), splat16<K.yR>()), mulHighU(shl<8>(v.c[1]), splat16<K.yG>())),
-                                                 mulHighU(shl<8>(v.c[2]), splat16<K.yB>())),
-                                             splat16<c>())));
+        return add(add(add(mulHighU(shl<8>(v.c[0]), splat16<K.yR>()), mulHighU(shl<8>(v.c[1]), splat16<K.yG>())),
+                       mulHighU(shl<8>(v.c[2]), splat16<K.yB>())),
+                   splat16<c>());
     }
-    static void apply(const V3* a, const V3* b, V (&y)[2][2], V& cb, V& cr)
+    static V lumaOut(V t) { return limitLanes<K.full>(shr<7>(t)); }
+    static void chroma(const V3& s, V, V& cb, V& cr)
     {
-        for (int r = 0; r < rows; ++r) {
-            y[r][0] = luma(a[r]);
-            y[r][1] = luma(b[r]);
-        }
-        const V3 s = unitSums<rows>(a, b);
         constexpr int up = F::scale == 64 ? 6 : 5;
         const V sr = shl<up>(s.c[0]), sg = shl<up>(s.c[1]), sb = shl<up>(s.c[2]);
         V vb, vr;
@@ -125,17 +107,17 @@ template <>
 struct SimdUnit<YccMixedBlock> {
     static constexpr int rows = 1;
     static constexpr YccForwardGains K = YccForward;
+    // Up to 56074 before the shift: an unsigned sum.
     static V luma(const V3& v)
     {
-        // Up to 56074 before the shift: an unsigned sum.
-        return add(shrU<8>(add(add(mulHighU(shl<8>(v.c[0]), splat16<K.yR>()), mulHighU(shl<8>(v.c[1]), splat16<K.yG>())),
-                               mulHighU(shl<8>(v.c[2]), splat16<K.yB>()))),
-                   splat16<16>());
+        return add(add(mulHighU(shl<8>(v.c[0]), splat16<K.yR>()), mulHighU(shl<8>(v.c[1]), splat16<K.yG>())),
+                   mulHighU(shl<8>(v.c[2]), splat16<K.yB>()));
     }
+    static V lumaOut(V t) { return add(shrU<8>(t), splat16<16>()); }
     // floor((kr SumR + kg SumG + kb SumB + 65536) / 131072) + 128 in 32-bit lanes: (SumR, SumG) and
     // (SumB, 4) pairs against (kr, kg) and (kb, 16384).
     template <int kr, int kg, int kb>
-    static V chroma(const V3& s)
+    static V part(const V3& s)
     {
         const V rg = splat32<(kr & 0xFFFF) | (kg << 16)>(), b1 = splat32<(kb & 0xFFFF) | (16384 << 16)>();
         const V four = splat16<4>();
@@ -144,12 +126,9 @@ struct SimdUnit<YccMixedBlock> {
         const V hi = half(unpackHi16(s.c[0], s.c[1]), unpackHi16(s.c[2], four));
         return add(packs32(lo, hi), splat16<128>());
     }
-    static void apply(const V3* a, const V3* b, V (&y)[2][2], V& cb, V& cr)
+    static void chroma(const V3& s, V, V& cb, V& cr)
     {
-        y[0][0] = luma(a[0]);
-        y[0][1] = luma(b[0]);
-        const V3 s = unitSums<1>(a, b);
-        cb = chroma<K.cbR, K.cbG, K.cbB>(s);
-        cr = chroma<K.crR, K.crG, K.crB>(s);
+        cb = part<K.cbR, K.cbG, K.cbB>(s);
+        cr = part<K.crR, K.crG, K.crB>(s);
     }
 };
