@@ -197,6 +197,37 @@ void toneMapDemo(Demo& d)
     d.write("tonemap-mean.pgm", mean);
 }
 
+// The picture as 4:2:0 planes (chroma at half width and height) and as packed 4:2:2 groups (shown as
+// bytes, two a pixel: the luma with the chroma interleaved between).
+void sampledDemo(Demo& d)
+{
+    const Image& in = d.input();
+    const ImageSize roi{in.width, in.height};
+    const std::size_t n = pixels(in);
+    Image y(in.width, in.height, 1), cb(in.width / 2, in.height / 2, 1), cr(in.width / 2, in.height / 2, 1);
+    uint8_t* p[3] = {y.data(), cb.data(), cr.data()};
+    const int steps[3] = {in.width, in.width / 2, in.width / 2};
+    d.time("zoxiRGBToYCbCr420_8u_C3P3R", n * 3 + n * 3 / 2,
+           [&] { return zoxiRGBToYCbCr420_8u_C3P3R(in.data(), in.step(), p, steps, roi); });
+    d.write("ycbcr420-y.pgm", y);
+    d.write("ycbcr420-cb.pgm", cb);
+    d.write("ycbcr420-cr.pgm", cr);
+    Image packed(in.width * 2, in.height, 1);
+    d.time("zoxiRGBToYCbCr422_8u_C3C2R", n * 5,
+           [&] { return zoxiRGBToYCbCr422_8u_C3C2R(in.data(), in.step(), packed.data(), packed.step(), roi); });
+    d.write("ycbcr422-packed.pgm", packed);
+    Image u411(in.width / 4, in.height, 1), v411(in.width / 4, in.height, 1), y411(in.width, in.height, 1);
+    Image bgra(in.width, in.height, 4);
+    for (std::size_t i = 0; i < n; ++i)
+        for (int k = 0; k < 3; ++k)
+            bgra.pixels[4 * i + k] = in.pixels[3 * i + 2 - k];
+    uint8_t* q[3] = {y411.data(), u411.data(), v411.data()};
+    const int steps411[3] = {in.width, in.width / 4, in.width / 4};
+    d.time("zoxiBGRToYCbCr411_8u_AC4P3R", n * 4 + n * 3 / 2,
+           [&] { return zoxiBGRToYCbCr411_8u_AC4P3R(bgra.data(), bgra.step(), q, steps411, roi); });
+    d.write("ycbcr411-cb.pgm", u411);
+}
+
 } // namespace
 
 const std::vector<FamilyDemo>& familyDemos()
@@ -208,6 +239,7 @@ const std::vector<FamilyDemo>& familyDemos()
         {"Gamma", gammaDemo},
         {"RGB <-> YCoCg", ycocgDemo},
         {"Tone mapping", toneMapDemo},
+        {"RGB to 4:2:0, 4:2:2 and 4:1:1", sampledDemo},
     };
     return demos;
 }
