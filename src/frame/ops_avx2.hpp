@@ -9,6 +9,7 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
+#include <cstring>
 
 namespace zox::avx2 {
 
@@ -150,6 +151,15 @@ inline void storeHighHalves(uint8_t* q, std::size_t g, V v)
 {
     _mm_storeh_pd(reinterpret_cast<double*>(q), _mm_castsi128_pd(_mm256_castsi256_si128(v)));
     _mm_storeh_pd(reinterpret_cast<double*>(q + g), _mm_castsi128_pd(_mm256_extracti128_si256(v, 1)));
+}
+// Four bytes from byte Byte of each 128-bit lane.
+template <int Byte>
+inline void storeQuarters(uint8_t* q, std::size_t g, V v)
+{
+    const int lo = _mm_extract_epi32(_mm_srli_si128(_mm256_castsi256_si128(v), Byte), 0);
+    const int hi = _mm_extract_epi32(_mm_srli_si128(_mm256_extracti128_si256(v, 1), Byte), 0);
+    std::memcpy(q, &lo, 4);
+    std::memcpy(q + g, &hi, 4);
 }
 inline V min16(V a, V b) { return _mm256_min_epi16(a, b); }
 inline V max16(V a, V b) { return _mm256_max_epi16(a, b); }

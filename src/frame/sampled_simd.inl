@@ -7,15 +7,15 @@
 // row is read: `luma(v)` gives a luma term of each pixel of v (samples in the low byte of 16-bit lanes)
 // and `lumaOut(t)` its Y before clip8; `chroma(sums, lumaSums, cb, cr)` gives the units' Cb and Cr from
 // the channel sums of each unit and, where the form declares `lumaSums`, the sums of the luma terms.
-// `rows` is its unit height.
+// `pixels` is its unit's size (4: 2x2 or 4x1, 2: 2x1).
 template <class Form>
 struct SimdUnit;
 
 template <class Form>
-consteval int simdUnitRows()
+consteval int simdUnitPixels()
 {
-    if constexpr (requires { SimdUnit<Form>::rows; })
-        return SimdUnit<Form>::rows;
+    if constexpr (requires { SimdUnit<Form>::pixels; })
+        return SimdUnit<Form>::pixels;
     else
         return 0;
 }
@@ -43,8 +43,13 @@ struct SampledGroupOut<OutSampledP3<S>> {
     static void chroma(const SampledPass& d, int, int u, V cb, V cr, V)
     {
         const V c = packUs(cb, cr);
-        storeLowHalves(d.c0 + u, 8, c);
-        storeHighHalves(d.c1 + u, 8, c);
+        if constexpr (S == Sampling::S411) { // four units a lane, repeated in the upper half of each part
+            storeQuarters<0>(d.c0 + u, 4, c);
+            storeQuarters<8>(d.c1 + u, 4, c);
+        } else {
+            storeLowHalves(d.c0 + u, 8, c);
+            storeHighHalves(d.c1 + u, 8, c);
+        }
     }
 };
 
@@ -84,18 +89,22 @@ int sampledGroups(const SourcePass<typename C::Src>& sIn, const SampledPass& dIn
 {
     using F = SimdUnit<typename C::Block>;
     using Out = SampledGroupOut<typename C::Dst>;
-    constexpr int rows = simdUnitRows<typename C::Block>();
-    if constexpr (C::variant != 2 && rows == C::uh && C::uw == 2) {
+    constexpr int rows = C::uh;
+    if constexpr (C::variant != 2 && simdUnitPixels<typename C::Block>() == C::uw * C::uh) {
         const SourcePass<typename C::Src> s = sIn;
         const SampledPass d = dIn;
-        constexpr int per = kGroupPixels / 2;
+        constexpr int per = kGroupPixels / C::uw;
         for (; u + per <= n; u += per) {
-            const int x = 2 * u;
+            const int x = C::uw * u;
             V sum[3], lumaSum = zero(), y = zero();
             #pragma GCC unroll 2
             for (int r = 0; r < rows; ++r) {
                 V3 a, b;
                 GroupIo<typename C::Src>::template get<0>(s.r[r], x, a, b);
+                if constexpr (requires { F::prepare(a); }) { // a form that first maps its samples
+                    F::prepare(a);
+                    F::prepare(b);
+                }
                 const V ta = F::luma(a), tb = F::luma(b);
                 y = packUs(F::lumaOut(ta), F::lumaOut(tb));
                 Out::luma(d, r, x, y);
@@ -104,6 +113,13 @@ int sampledGroups(const SourcePass<typename C::Src>& sIn, const SampledPass& dIn
                 #pragma GCC unroll 3
                 for (int k = 0; k < 3; ++k)
                     sum[k] = r == 0 ? hadd(a.c[k], b.c[k]) : add(sum[k], hadd(a.c[k], b.c[k]));
+            }
+            if constexpr (C::uw == 4) { // sums of four neighbouring lanes, each lane's four units twice
+                #pragma GCC unroll 3
+                for (int k = 0; k < 3; ++k)
+                    sum[k] = hadd(sum[k], sum[k]);
+                if constexpr (simdLumaSums<typename C::Block>())
+                    lumaSum = hadd(lumaSum, lumaSum);
             }
             V cb, cr;
             F::chroma(V3{{sum[0], sum[1], sum[2]}, zero()}, lumaSum, cb, cr);

@@ -10,25 +10,27 @@ inline V roundedLuma(const V3& v)
                mulRound(shl<7>(v.c[2]), splat16<kb>()));
 }
 
-template <>
-struct SimdUnit<YccRoundBlock<false>> {
-    static constexpr int rows = 2;
+template <bool OffsetAfter>
+struct SimdUnit<YccRoundBlock<OffsetAfter>> {
+    static constexpr int pixels = 4;
     static constexpr YccForwardMagnitudes K = YccForwardRound;
     static V luma(const V3& v) { return roundedLuma<K.yR, K.yG, K.yB>(v); }
-    static V lumaOut(V t) { return shr<6>(add(t, splat16<1026>())); }
+    static V lumaOut(V t)
+    {
+        return OffsetAfter ? add(shr<6>(t), splat16<16>()) : shr<6>(add(t, splat16<1026>()));
+    }
+    static V offset(V v) { return OffsetAfter ? add(shr<6>(v), splat16<128>()) : shr<6>(add(v, splat16<8194>())); }
     static void chroma(const V3& s, V, V& cb, V& cr)
     {
         const V sr = shl<5>(s.c[0]), sg = shl<5>(s.c[1]), sb = shl<5>(s.c[2]);
-        cb = shr<6>(sub(sub(add(mulRound(sb, splat16<K.cbB>()), splat16<8194>()), mulRound(sg, splat16<K.cbG>())),
-                        mulRound(sr, splat16<K.cbR>())));
-        cr = shr<6>(sub(sub(add(mulRound(sr, splat16<K.crR>()), splat16<8194>()), mulRound(sg, splat16<K.crG>())),
-                        mulRound(sb, splat16<K.crB>())));
+        cb = offset(sub(sub(mulRound(sb, splat16<K.cbB>()), mulRound(sg, splat16<K.cbG>())), mulRound(sr, splat16<K.cbR>())));
+        cr = offset(sub(sub(mulRound(sr, splat16<K.crR>()), mulRound(sg, splat16<K.crG>())), mulRound(sb, splat16<K.crB>())));
     }
 };
 
 template <>
 struct SimdUnit<YuvR420Block> {
-    static constexpr int rows = 2;
+    static constexpr int pixels = 4;
     static constexpr bool lumaSums = true;
     static V luma(const V3& v) { return roundedLuma<4899, 9617, 1868>(v); }
     static V lumaOut(V t) { return shr<6>(t); }
@@ -43,7 +45,7 @@ struct SimdUnit<YuvR420Block> {
 
 template <>
 struct SimdUnit<YuvH420Block> {
-    static constexpr int rows = 2;
+    static constexpr int pixels = 4;
     static constexpr bool lumaSums = true;
     using K = YuvHalfForward;
     static V luma(const V3& v)
@@ -73,7 +75,7 @@ inline V limitLanes(V v)
 template <const YccForwardMagnitudes& K, SumChroma Kind>
 struct SimdUnit<YccSumBlock<K, Kind>> {
     using F = YccSumBlock<K, Kind>;
-    static constexpr int rows = Kind == SumChroma::Sum ? 2 : 1;
+    static constexpr int pixels = F::n;
     static V luma(const V3& v)
     {
         constexpr int c = K.full ? 64 : 2112;
@@ -105,7 +107,7 @@ struct SimdUnit<YccSumBlock<K, Kind>> {
 
 template <>
 struct SimdUnit<YccMixedBlock> {
-    static constexpr int rows = 1;
+    static constexpr int pixels = 2;
     static constexpr YccForwardGains K = YccForward;
     // Up to 56074 before the shift: an unsigned sum.
     static V luma(const V3& v)
@@ -130,5 +132,66 @@ struct SimdUnit<YccMixedBlock> {
     {
         cb = part<K.cbR, K.cbG, K.cbB>(s);
         cr = part<K.crR, K.crG, K.crB>(s);
+    }
+};
+
+// Q14: each pixel's luma term floor((9798 R + 19235 G) / 16384) + floor(3736 B / 16384) (+ 1), the
+// first through pair multiply-adds in 32-bit lanes.
+template <bool Plus1>
+struct SimdUnit<YuvQ14Block<Plus1>> {
+    static constexpr int pixels = 2;
+    static constexpr bool lumaSums = true;
+    using K = YuvHalfForward;
+    static V luma(const V3& v)
+    {
+        const V rg = splat32<(K::yR & 0xFFFF) | (K::yG << 16)>();
+        const V lo = shr32<14>(madd16(unpackLo16(v.c[0], v.c[1]), rg)), hi = shr32<14>(madd16(unpackHi16(v.c[0], v.c[1]), rg));
+        return add(add(packs32(lo, hi), mulHigh(shl<2>(v.c[2]), splat16<K::yB>())), splat16<Plus1 ? 1 : 0>());
+    }
+    static V lumaOut(V t) { return shr<1>(t); }
+    static void chroma(const V3& s, V t, V& cb, V& cr)
+    {
+        const V m = shr<1>(t);
+        cb = add(mulHigh(sub(s.c[2], m), splat16<K::uGain>()), splat16<128>());
+        cr = add(mulHigh(sub(s.c[0], m), splat16<K::vGain>()), splat16<128>());
+    }
+};
+
+// R422: R420's luma terms; chroma of 64 x sums less both terms.
+template <>
+struct SimdUnit<YuvR422Block> {
+    static constexpr int pixels = 2;
+    static constexpr bool lumaSums = true;
+    static V luma(const V3& v) { return roundedLuma<4899, 9617, 1868>(v); }
+    static V lumaOut(V t) { return shr<6>(t); }
+    static void chroma(const V3& s, V t, V& cb, V& cr)
+    {
+        cb = add(shr<6>(mulRound(sub(shl<6>(s.c[2]), t), splat16<8061>())), splat16<128>());
+        cr = add(shr<6>(mulRound(sub(shl<6>(s.c[0]), t), splat16<14369>())), splat16<128>());
+    }
+};
+
+// D257: each sample first widened to floor(257 x / 64), which is 4 x + floor(x / 64); the unit sums are
+// of the widened samples.
+template <>
+struct SimdUnit<YuvD257Block> {
+    static constexpr int pixels = 2;
+    static constexpr bool lumaSums = true;
+    using K = YuvHalfForward;
+    static void prepare(V3& v)
+    {
+        #pragma GCC unroll 3
+        for (int k = 0; k < 3; ++k)
+            v.c[k] = add(shl<2>(v.c[k]), shrU<6>(v.c[k]));
+    }
+    static V luma(const V3& v)
+    {
+        return add(add(mulHigh(v.c[0], splat16<K::yR>()), mulHigh(v.c[1], splat16<K::yG>())), mulHigh(v.c[2], splat16<K::yB>()));
+    }
+    static V lumaOut(V t) { return shr<1>(t); }
+    static void chroma(const V3& s, V t, V& cb, V& cr)
+    {
+        cb = add(shr<1>(mulHigh(sub(shr<1>(s.c[2]), t), splat16<K::uGain>())), splat16<128>());
+        cr = add(shr<1>(mulHigh(sub(shr<1>(s.c[0]), t), splat16<K::vGain>())), splat16<128>());
     }
 };
