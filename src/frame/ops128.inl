@@ -137,7 +137,7 @@ inline V madd16(V a, V b) { return _mm_madd_epi16(a, b); }
 // their own (the next lane's g bytes on), and 16-bit limits.
 inline V hadd(V a, V b) { return _mm_hadd_epi16(a, b); }
 inline void storeLowHalves(uint8_t* q, std::size_t, V v) { _mm_storel_epi64(reinterpret_cast<V*>(q), v); }
-inline void storeHighHalves(uint8_t* q, std::size_t, V v) { _mm_storeh_pd(reinterpret_cast<double*>(q), _mm_castsi128_pd(v)); }
+inline void storeHighHalves(uint8_t* q, std::size_t, V v) { _mm_storel_epi64(reinterpret_cast<V*>(q), _mm_unpackhi_epi64(v, v)); }
 template <int Byte>
 inline void storeQuarters(uint8_t* q, std::size_t, V v) { store4(q, _mm_srli_si128(v, Byte)); }
 inline V min16(V a, V b) { return _mm_min_epi16(a, b); }

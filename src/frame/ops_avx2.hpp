@@ -149,8 +149,9 @@ inline void storeLowHalves(uint8_t* q, std::size_t g, V v)
 }
 inline void storeHighHalves(uint8_t* q, std::size_t g, V v)
 {
-    _mm_storeh_pd(reinterpret_cast<double*>(q), _mm_castsi128_pd(_mm256_castsi256_si128(v)));
-    _mm_storeh_pd(reinterpret_cast<double*>(q + g), _mm_castsi128_pd(_mm256_extracti128_si256(v, 1)));
+    const V h = _mm256_unpackhi_epi64(v, v);
+    _mm_storel_epi64(reinterpret_cast<__m128i*>(q), _mm256_castsi256_si128(h));
+    _mm_storel_epi64(reinterpret_cast<__m128i*>(q + g), _mm256_extracti128_si256(h, 1));
 }
 // Four bytes from byte Byte of each 128-bit lane.
 template <int Byte>
