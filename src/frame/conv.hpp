@@ -104,6 +104,24 @@ void convertRows(typename C::Src::Arg src, int srcStep, typename C::Dst::Arg dst
         convertRow<C, K>(C::Src::row(src, srcStep, r), C::Dst::row(dst, dstStep, r), roi.width, ctx);
 }
 
+// The argument checks in the order of C: the top-level pointers, the elements of pointer arrays
+// (`elements`, called only once the pointers are known) and the sizes. zoxStatusOk when the call may go on.
+template <Checks C, class Elements>
+zoxStatus checkArguments(bool pointers, Elements elements, bool sizesOk)
+{
+    if (!pointers)
+        return zoxStatusNullPointer;
+    if constexpr (C != Checks::PointersSizesPlanes)
+        if (!elements())
+            return zoxStatusNullPointer;
+    if (!sizesOk)
+        return zoxStatusBadSize;
+    if constexpr (C == Checks::PointersSizesPlanes)
+        if (!elements())
+            return zoxStatusNullPointer;
+    return zoxStatusOk;
+}
+
 // The validating layer and row walk. Steps are taken as they come: any value walks rows at that distance.
 template <class C>
 zoxStatus convert(typename C::Src::Arg src, int srcStep, typename C::Dst::Arg dst, int dstStep, ImageSize roi,
@@ -111,16 +129,10 @@ zoxStatus convert(typename C::Src::Arg src, int srcStep, typename C::Dst::Arg ds
 {
     using Src = typename C::Src;
     using Dst = typename C::Dst;
-    if (!src || !dst)
-        return zoxStatusNullPointer;
-    if constexpr (C::checks != Checks::PointersSizesPlanes)
-        if (!Src::planesValid(src) || !Dst::planesValid(dst))
-            return zoxStatusNullPointer;
-    if (roi.width < 1 || roi.height < 1)
-        return C::checks == Checks::PointersPlanesEmpty ? zoxStatusOk : zoxStatusBadSize;
-    if constexpr (C::checks == Checks::PointersSizesPlanes)
-        if (!Src::planesValid(src) || !Dst::planesValid(dst))
-            return zoxStatusNullPointer;
+    const zoxStatus st = checkArguments<C::checks>(
+        src && dst, [&] { return Src::planesValid(src) && Dst::planesValid(dst); }, roi.width >= 1 && roi.height >= 1);
+    if (st != zoxStatusOk) // an empty size is nothing to do where the member says so
+        return st == zoxStatusBadSize && C::checks == Checks::PointersPlanesEmpty ? zoxStatusOk : st;
     if constexpr (kChosenAtLoad) {
         if (activeKernelSet() == KernelSet::Avx2)
             convertRows<C, KernelSet::Avx2>(src, srcStep, dst, dstStep, roi, ctx);

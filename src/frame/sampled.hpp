@@ -309,35 +309,17 @@ void convertSampledImage(typename C::Src::Arg src, std::ptrdiff_t srcStep, const
     }
 }
 
-// The validating layer: the top-level pointers, the elements of pointer arrays and the sizes in the
-// member's order; then the conversion, and the member's warning with the finished result.
-template <class R, class Run>
-zoxStatus checkedSampled(bool pointersValid, bool elementsValid, ImageSize roi, Run run)
+// The validating layer: the member's argument checks and minimum size; then the conversion, and the
+// member's warning with the finished result.
+template <class R, class Elements, class Run>
+zoxStatus checkedSampled(bool pointers, Elements elements, ImageSize roi, Run run)
 {
-    if (!pointersValid)
-        return zoxStatusNullPointer;
-    if constexpr (R::checks != Checks::PointersSizesPlanes)
-        if (!elementsValid)
-            return zoxStatusNullPointer;
-    if (roi.width < R::minWidth || roi.height < R::minHeight)
-        return zoxStatusBadSize;
-    if constexpr (R::checks == Checks::PointersSizesPlanes)
-        if (!elementsValid)
-            return zoxStatusNullPointer;
+    const zoxStatus st =
+        checkArguments<R::checks>(pointers, elements, roi.width >= R::minWidth && roi.height >= R::minHeight);
+    if (st != zoxStatusOk)
+        return st;
     run();
     return R::warns(roi) ? zoxWarnOddSize : zoxStatusOk;
-}
-
-inline bool allPlanes3(uint8_t* const* p)
-{
-    return p[0] && p[1] && p[2];
-}
-
-// A frame of three planes in the call's order; chroma planes exchanged for members that name Cr first.
-inline SampledFrame framePlanes3(uint8_t* const* p, const int* step, bool crFirst)
-{
-    const int a = crFirst ? 2 : 1, b = crFirst ? 1 : 2;
-    return {{p[0], p[a], p[b]}, {step[0], step[a], step[b]}};
 }
 
 // A form pair of a member whose kernel, and so its values, depend on whether its rows are aligned.
@@ -406,6 +388,46 @@ void runAsOneRow(SrcArg src, const SampledFrame& dst, int64_t pixels)
     }
 }
 
+// The calls of each export shape, over a table row and its rules.
+// src, srcStep, dst[3], dstStep[3]: Y, Cb, Cr, or with CrFirst Y, Cr, Cb (exchanged on the way in).
+template <class Row, class R, bool CrFirst, class SrcArg>
+zoxStatus toPlanes3(SrcArg src, int srcStep, uint8_t* const* dst, const int* step, ImageSize roi)
+{
+    using Src = typename Row::Other::Src;
+    return checkedSampled<R>(src && dst && step, [&] { return Src::planesValid(src) && dst[0] && dst[1] && dst[2]; }, roi, [&] {
+        const int a = CrFirst ? 2 : 1, b = CrFirst ? 1 : 2;
+        runSampled<Row>(src, srcStep, SampledFrame{{dst[0], dst[a], dst[b]}, {step[0], step[a], step[b]}}, roi);
+    });
+}
+
+// src, srcStep, and two planes (Y and Cb,Cr pairs) or one (4:2:2 groups, second pointer null).
+template <class Row, class R, class SrcArg>
+zoxStatus toPlanes(SrcArg src, int srcStep, uint8_t* p0, int step0, uint8_t* p1, int step1, ImageSize roi)
+{
+    using Src = typename Row::Other::Src;
+    constexpr bool two = Row::Other::Dst::planes == 2;
+    return checkedSampled<R>(src && p0 && (!two || p1), [&] { return Src::planesValid(src); }, roi,
+                             [&] { runSampled<Row>(src, srcStep, SampledFrame{{p0, p1, nullptr}, {step0, step1, 0}}, roi); });
+}
+
+// src, dst[3]: packed planes, source rows of width pixels, chroma steps width / 2 (4:2:0) or width / 2
+// rounded up (4:2:2). A 4:2:2 image of even width and 256 pixels or more goes as one row of width x
+// height pixels, in the forms for unaligned rows.
+template <class Row, class R, class SrcArg>
+zoxStatus toPackedPlanes3(SrcArg src, uint8_t* const* dst, ImageSize roi)
+{
+    using Src = typename Row::Other::Src;
+    return checkedSampled<R>(src && dst, [&] { return Src::planesValid(src) && dst[0] && dst[1] && dst[2]; }, roi, [&] {
+        const std::ptrdiff_t w = roi.width, cw = Row::Other::sampling == Sampling::S420 ? w / 2 : w / 2 + w % 2;
+        const SampledFrame f{{dst[0], dst[1], dst[2]}, {w, cw, cw}};
+        const int64_t pixels = static_cast<int64_t>(roi.width) * roi.height;
+        if (Row::Other::sampling == Sampling::S422 && w % 2 == 0 && pixels >= 256)
+            runAsOneRow<Row>(src, f, pixels);
+        else
+            runSampled<Row>(src, w * Src::bytesPerPixel, f, roi);
+    });
+}
+
 } // namespace zox
 
 // Export shapes of the sampled conversions. A family table row names one of these:
@@ -415,66 +437,34 @@ void runAsOneRow(SrcArg src, const SampledFrame& dst, int64_t pixels)
 #define ZOX_SHAPE_TO_P3(name, Src, Dst, Lim, Block, Rem, Tail, Rules)                                              \
     ZOXCC_API zoxStatus name(Src::Arg src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize) \
     {                                                                                                               \
-        return ::zox::checkedSampled<Rules>(src && dst && dstStep, src && dst && Src::planesValid(src) && ::zox::allPlanes3(dst),  \
-                                            roiSize, [&] {                                                          \
-            ::zox::runSampled<ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail)>(                                    \
-                src, srcStep, ::zox::framePlanes3(dst, dstStep, false), roiSize);                                    \
-        });                                                                                                         \
+        return ::zox::toPlanes3<ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail), Rules, false>(src, srcStep, dst, dstStep, roiSize); \
     }
-// The same with Cr before Cb in both arrays: the planes exchanged on the way in.
+// The same with Cr before Cb in both arrays.
 #define ZOX_SHAPE_TO_P3_CR_FIRST(name, Src, Dst, Lim, Block, Rem, Tail, Rules)                                     \
     ZOXCC_API zoxStatus name(Src::Arg src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize) \
     {                                                                                                               \
-        return ::zox::checkedSampled<Rules>(src && dst && dstStep, src && dst && Src::planesValid(src) && ::zox::allPlanes3(dst),  \
-                                            roiSize, [&] {                                                          \
-            ::zox::runSampled<ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail)>(                                    \
-                src, srcStep, ::zox::framePlanes3(dst, dstStep, true), roiSize);                                     \
-        });                                                                                                         \
+        return ::zox::toPlanes3<ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail), Rules, true>(src, srcStep, dst, dstStep, roiSize); \
     }
 // src, srcStep, dstY, dstYStep, dstCbCr, dstCbCrStep, roiSize
 #define ZOX_SHAPE_TO_P2(name, Src, Dst, Lim, Block, Rem, Tail, Rules)                                              \
     ZOXCC_API zoxStatus name(Src::Arg src, int srcStep, uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, \
                              ImageSize roiSize)                                                                     \
     {                                                                                                               \
-        return ::zox::checkedSampled<Rules>(src && dstY && dstCbCr, src && Src::planesValid(src), roiSize, [&] {           \
-            ::zox::runSampled<ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail)>(                                    \
-                src, srcStep, ::zox::SampledFrame{{dstY, dstCbCr, nullptr}, {dstYStep, dstCbCrStep, 0}}, roiSize);   \
-        });                                                                                                         \
+        return ::zox::toPlanes<ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail), Rules>(src, srcStep, dstY, dstYStep, dstCbCr, \
+                                                                                          dstCbCrStep, roiSize);    \
     }
 // src, srcStep, dst, dstStep, roiSize
 #define ZOX_SHAPE_TO_C2(name, Src, Dst, Lim, Block, Rem, Tail, Rules)                                              \
     ZOXCC_API zoxStatus name(Src::Arg src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize)              \
     {                                                                                                               \
-        return ::zox::checkedSampled<Rules>(src && dst, src && Src::planesValid(src), roiSize, [&] {                       \
-            ::zox::runSampled<ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail)>(                                    \
-                src, srcStep, ::zox::SampledFrame{{dst, nullptr, nullptr}, {dstStep, 0, 0}}, roiSize);               \
-        });                                                                                                         \
+        return ::zox::toPlanes<ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail), Rules>(src, srcStep, dst, dstStep, nullptr, 0, \
+                                                                                          roiSize);                 \
     }
-// src, dst[3], imageSize: packed 4:2:0 planes, source rows of width pixels, chroma steps width / 2.
-#define ZOX_SHAPE_TO_P3_IMAGE420(name, Src, Dst, Lim, Block, Rem, Tail, Rules)                                     \
+// src, dst[3], imageSize: packed planes
+#define ZOX_SHAPE_TO_P3_IMAGE(name, Src, Dst, Lim, Block, Rem, Tail, Rules)                                        \
     ZOXCC_API zoxStatus name(Src::Arg src, uint8_t* const dst[3], ImageSize imageSize)                               \
     {                                                                                                               \
-        return ::zox::checkedSampled<Rules>(src && dst, src && dst && Src::planesValid(src) && ::zox::allPlanes3(dst), imageSize, [&] { \
-            const std::ptrdiff_t w = imageSize.width;                                                               \
-            ::zox::runSampled<ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail)>(                                    \
-                src, w * Src::bytesPerPixel, ::zox::SampledFrame{{dst[0], dst[1], dst[2]}, {w, w / 2, w / 2}}, imageSize); \
-        });                                                                                                         \
-    }
-// src, dst[3], imageSize: packed 4:2:2 planes, chroma steps width / 2 rounded up. An even width with 256
-// pixels or more in the image goes as one row of width x height pixels, in the form for unaligned rows.
-#define ZOX_SHAPE_TO_P3_IMAGE422(name, Src, Dst, Lim, Block, Rem, Tail, Rules)                                     \
-    ZOXCC_API zoxStatus name(Src::Arg src, uint8_t* const dst[3], ImageSize imageSize)                               \
-    {                                                                                                               \
-        return ::zox::checkedSampled<Rules>(src && dst, src && dst && Src::planesValid(src) && ::zox::allPlanes3(dst), imageSize, [&] { \
-            using Row = ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail);                                           \
-            const std::ptrdiff_t w = imageSize.width;                                                               \
-            const ::zox::SampledFrame f{{dst[0], dst[1], dst[2]}, {w, w / 2 + w % 2, w / 2 + w % 2}};               \
-            const int64_t pixels = static_cast<int64_t>(imageSize.width) * imageSize.height;                        \
-            if (w % 2 == 0 && pixels >= 256)                                                                        \
-                ::zox::runAsOneRow<Row>(src, f, pixels);                                        \
-            else                                                                                                    \
-                ::zox::runSampled<Row>(src, w * Src::bytesPerPixel, f, imageSize);                                  \
-        });                                                                                                         \
+        return ::zox::toPackedPlanes3<ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail), Rules>(src, dst, imageSize); \
     }
 
 // Table expansion for a family's *_sse41.cpp and *_avx2.cpp: the kernels of each row, for aligned rows and

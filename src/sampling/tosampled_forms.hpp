@@ -222,42 +222,37 @@ struct YuvR420Block {
     }
 };
 
-// Y14 and Y16, unit of 4: whole-sample luma truncated, differences of sums against the four lumas.
-struct YuvY14Unit {
-    static UnitOut apply(const Unit& u)
-    {
-        UnitOut o{};
-        int tt = 0;
-        for (int k = 0; k < 4; ++k) {
-            const int t = 4899 * u.p[k].c[0] + 9617 * u.p[k].c[1] + 1868 * u.p[k].c[2];
-            o.y[k] = t >> 14;
-            tt += t;
-        }
-        const UnitSums<4> s(u);
-        const int db = (16384 * s.b - tt) >> 14, dr = (16384 * s.r - tt) >> 14;
-        o.cb = ((8061 * db) >> 16) + 128;
-        o.cr = clip8(((14369 * dr) >> 16) + 128);
-        return o;
-    }
+// Difference forms: whole-sample luma terms t in 2^-shift, Y = floor((t + yRound) / 2^shift), and the
+// chroma of differences of the unit's sums against the sum of its terms,
+// d = floor((2^shift Sum - sum of t + dBias) / 2^shift), U = floor(uGain d / 2^gainShift) + 128 (never
+// outside 0..255), V likewise held to 0..255.
+struct YuvY14Gains {
+    static constexpr int yR = 4899, yG = 9617, yB = 1868, uGain = 8061, vGain = 14369;
 };
-struct YuvY16Unit {
-    using K = YuvDifferenceForward;
+template <int n, class K, int shift, int yRound, int dBias, int gainShift>
+struct YuvDifferenceUnit {
     static UnitOut apply(const Unit& u)
     {
         UnitOut o{};
         int tt = 0;
-        for (int k = 0; k < 4; ++k) {
+        for (int k = 0; k < n; ++k) {
             const int t = K::yR * u.p[k].c[0] + K::yG * u.p[k].c[1] + K::yB * u.p[k].c[2];
-            o.y[k] = t >> 16;
+            o.y[k] = (t + yRound) >> shift;
             tt += t;
         }
-        const UnitSums<4> s(u);
-        const int db = (65536 * s.b - tt + 131071) >> 16, dr = (65536 * s.r - tt + 131071) >> 16;
-        o.cb = ((K::uGain * db) >> 18) + 128;
-        o.cr = clip8(((K::vGain * dr) >> 18) + 128);
+        const UnitSums<n> s(u);
+        const int db = ((s.b << shift) - tt + dBias) >> shift, dr = ((s.r << shift) - tt + dBias) >> shift;
+        o.cb = ((K::uGain * db) >> gainShift) + 128;
+        o.cr = clip8(((K::vGain * dr) >> gainShift) + 128);
         return o;
     }
 };
+// Unit of 4 in 1/16384, truncated; in 1/65536 with the differences rounded up.
+using YuvY14Unit = YuvDifferenceUnit<4, YuvY14Gains, 14, 0, 0, 16>;
+using YuvY16Unit = YuvDifferenceUnit<4, YuvDifferenceForward, 16, 0, 131071, 18>;
+// Pairs in 1/65536: full rounding, or truncated luma with the differences rounded up.
+template <bool Full>
+using YuvD422Unit = YuvDifferenceUnit<2, YuvDifferenceForward, 16, Full ? 32768 : 0, Full ? 32768 : 65535, 17>;
 
 // H420, unit of 4: multiply-highs of 4 x sample; chroma of half sums less a quarter of the four lumas.
 struct YuvH420Block {
@@ -324,23 +319,6 @@ struct YuvD257Block {
         const int db = ((w[0][2] + w[1][2]) >> 1) - t, dr = ((w[0][0] + w[1][0]) >> 1) - t;
         return {{clip8(y[0] >> 1), clip8(y[1] >> 1)}, clip8((mulHigh(db, K::uGain) >> 1) + 128),
                 clip8((mulHigh(dr, K::vGain) >> 1) + 128)};
-    }
-};
-
-// D422, pair: whole-sample luma, full rounding or low rounding.
-template <bool Full>
-struct YuvD422Unit {
-    using K = YuvDifferenceForward;
-    static UnitOut apply(const Unit& u)
-    {
-        int t[2];
-        for (int k = 0; k < 2; ++k)
-            t[k] = K::yR * u.p[k].c[0] + K::yG * u.p[k].c[1] + K::yB * u.p[k].c[2];
-        const UnitSums<2> s(u);
-        const int tt = t[0] + t[1];
-        const int yr = Full ? 32768 : 0, dd = Full ? 32768 : 65535;
-        const int db = (65536 * s.b - tt + dd) >> 16, dr = (65536 * s.r - tt + dd) >> 16;
-        return {{(t[0] + yr) >> 16, (t[1] + yr) >> 16}, ((K::uGain * db) >> 17) + 128, clip8(((K::vGain * dr) >> 17) + 128)};
     }
 };
 

@@ -94,9 +94,9 @@ using Tail709FullYCb = YccPixelTail<YccPixel709Full, 32768, WritesY | WritesCb>;
     X(zoxiBGRToYCrCb420_8u_AC4P3R, ZOX_SHAPE_TO_P3_CR_FIRST, InBGR4, ToP420, Limit::LB, Ycc601Sum, YccPixel4<YccForward>, NoTail, Rules420Two)          \
     X(zoxiBGRToYCrCb420_709CSC_8u_C3P3R, ZOX_SHAPE_TO_P3_CR_FIRST, InBGR3, ToP420, Limit::LB, Ycc709Sum, YccPixel4<YccPixel709>, NoTail, Rules420Two)   \
     X(zoxiBGRToYCrCb420_709CSC_8u_AC4P3R, ZOX_SHAPE_TO_P3_CR_FIRST, InBGR4, ToP420, Limit::LB, Ycc709Sum, YccPixel4<YccPixel709>, NoTail, Rules420Two)  \
-    X(zoxiRGBToYUV420_8u_C3P3, ZOX_SHAPE_TO_P3_IMAGE420, InC3, ToP420, Limit::L8, YuvR420Block, YuvY14Unit, NoTail, Rules420Any)                        \
-    X(zoxiRGBToYUV420_8u_P3, ZOX_SHAPE_TO_P3_IMAGE420, InP3, ToP420, Limit::None, NoBlock, YuvY16Unit, NoTail, Rules420Any)                             \
-    X(zoxiRGBToYUV422_8u_C3P3, ZOX_SHAPE_TO_P3_IMAGE422, InC3, ToP422, Limit::L16, YuvR422OrQ14, YuvQ14OrD422, YuvHalfTailRounded, Rules422Yuv)         \
-    X(zoxiRGBToYUV422_8u_P3, ZOX_SHAPE_TO_P3_IMAGE422, InP3, ToP422, Limit::L16, YuvD257Block, YuvD422Unit<false>, YuvHalfTailTruncated, Rules422Yuv)
+    X(zoxiRGBToYUV420_8u_C3P3, ZOX_SHAPE_TO_P3_IMAGE, InC3, ToP420, Limit::L8, YuvR420Block, YuvY14Unit, NoTail, Rules420Any)                        \
+    X(zoxiRGBToYUV420_8u_P3, ZOX_SHAPE_TO_P3_IMAGE, InP3, ToP420, Limit::None, NoBlock, YuvY16Unit, NoTail, Rules420Any)                             \
+    X(zoxiRGBToYUV422_8u_C3P3, ZOX_SHAPE_TO_P3_IMAGE, InC3, ToP422, Limit::L16, YuvR422OrQ14, YuvQ14OrD422, YuvHalfTailRounded, Rules422Yuv)         \
+    X(zoxiRGBToYUV422_8u_P3, ZOX_SHAPE_TO_P3_IMAGE, InP3, ToP422, Limit::L16, YuvD257Block, YuvD422Unit<false>, YuvHalfTailTruncated, Rules422Yuv)
 
 #define ZOX_TO_SAMPLED_TABLE(X) ZOX_TO_SAMPLED_OWN_TABLE(X) ZOX_TO_SAMPLED_SISTER_TABLE(X)

@@ -17,11 +17,27 @@
 
 namespace zt {
 
+// Guarded planes, whose bytes can be taken and put back.
+struct PlaneSet {
+    std::vector<std::unique_ptr<Plane>> planes;
+    std::vector<std::vector<uint8_t>> bytes() const
+    {
+        std::vector<std::vector<uint8_t>> b;
+        for (const auto& p : planes)
+            b.push_back(p->bytes());
+        return b;
+    }
+    void restore(const std::vector<std::vector<uint8_t>>& b)
+    {
+        for (std::size_t i = 0; i < planes.size(); ++i)
+            planes[i]->restore(b[i]);
+    }
+};
+
 // The planes of one side of a call.
 template <class L>
-struct Side {
+struct Side : PlaneSet {
     using T = typename L::Sample;
-    std::vector<std::unique_ptr<Plane>> planes;
     std::vector<T*> ptrs; // the planes' first samples, typed
     int step = 0;
 
@@ -41,25 +57,24 @@ struct Side {
                     }
         }
     }
-    typename L::Arg arg()
+    typename L::Arg arg() { return argOf(ptrs); }
+    // The argument with one plane (0..) or the pointer itself (9) null; -1: as it is. `scratch` holds
+    // the plane array it points into.
+    typename L::Arg argWithNull(int which, std::vector<T*>& scratch) const
     {
-        if constexpr (L::planes == 1 && std::is_pointer_v<typename L::Arg> &&
-                      !std::is_pointer_v<std::remove_pointer_t<typename L::Arg>>)
-            return ptrs[0];
+        scratch = ptrs;
+        if (which >= 0 && which < 9)
+            scratch[which] = nullptr;
+        return which == 9 ? nullptr : argOf(scratch);
+    }
+
+private:
+    static typename L::Arg argOf(std::vector<T*>& p)
+    {
+        if constexpr (L::planes == 1 && !std::is_pointer_v<std::remove_pointer_t<typename L::Arg>>)
+            return p[0];
         else
-            return ptrs.data();
-    }
-    std::vector<std::vector<uint8_t>> bytes() const
-    {
-        std::vector<std::vector<uint8_t>> b;
-        for (const auto& p : planes)
-            b.push_back(p->bytes());
-        return b;
-    }
-    void restore(const std::vector<std::vector<uint8_t>>& b)
-    {
-        for (std::size_t i = 0; i < planes.size(); ++i)
-            planes[i]->restore(b[i]);
+            return p.data();
     }
 };
 
@@ -218,27 +233,10 @@ void checkValidation(const char* name, F f)
     }
     for (const Row& row : rows) {
         SCOPED_TRACE(std::string(name) + ": " + row.what);
-        auto sp = src.ptrs;
-        auto dp = dst.ptrs;
-        if (row.srcNull >= 0 && row.srcNull < 9)
-            sp[row.srcNull] = nullptr;
-        if (row.dstNull >= 0 && row.dstNull < 9)
-            dp[row.dstNull] = nullptr;
-        typename Src::Arg sa;
-        typename Dst::Arg da;
-        if constexpr (Src::planes == 1 && !std::is_pointer_v<std::remove_pointer_t<typename Src::Arg>>)
-            sa = sp[0];
-        else
-            sa = sp.data();
-        if constexpr (Dst::planes == 1 && !std::is_pointer_v<std::remove_pointer_t<typename Dst::Arg>>)
-            da = dp[0];
-        else
-            da = dp.data();
-        if (row.srcNull == 9)
-            sa = nullptr;
-        if (row.dstNull == 9)
-            da = nullptr;
-        EXPECT_EQ(callExport<C>(f, sa, src.step, da, dst.step, row.roi, 0), row.want);
+        std::vector<typename Src::Sample*> sp;
+        std::vector<typename Dst::Sample*> dp;
+        EXPECT_EQ(callExport<C>(f, src.argWithNull(row.srcNull, sp), src.step, dst.argWithNull(row.dstNull, dp), dst.step, row.roi, 0),
+                  row.want);
         EXPECT_EQ(dst.bytes(), before) << "written before validation passed";
     }
 }
@@ -315,16 +313,24 @@ inline std::vector<zox::KernelSet> runnableKernelSets()
     return sets;
 }
 
-template <class C>
-void rowThrough(zox::KernelSet k, const typename C::Src::Row& s, const typename C::Dst::Row& d, int width, const zox::Ctx& ctx)
+// Runs f.template operator()<K>() for kernel set k: the set's kernels where the build holds them, else the
+// portable forms.
+template <class F>
+void onKernelSet(zox::KernelSet k, F&& f)
 {
     if constexpr (zox::kHaveAvx2)
         if (k == zox::KernelSet::Avx2)
-            return zox::convertRow<C, zox::KernelSet::Avx2>(s, d, width, ctx);
+            return f.template operator()<zox::KernelSet::Avx2>();
     if constexpr (zox::kHaveSse41)
         if (k == zox::KernelSet::Sse41)
-            return zox::convertRow<C, zox::KernelSet::Sse41>(s, d, width, ctx);
-    zox::convertRow<C, zox::KernelSet::Portable>(s, d, width, ctx);
+            return f.template operator()<zox::KernelSet::Sse41>();
+    f.template operator()<zox::KernelSet::Portable>();
+}
+
+template <class C>
+void rowThrough(zox::KernelSet k, const typename C::Src::Row& s, const typename C::Dst::Row& d, int width, const zox::Ctx& ctx)
+{
+    onKernelSet(k, [&]<zox::KernelSet K>() { zox::convertRow<C, K>(s, d, width, ctx); });
 }
 
 // Every kernel set the processor runs against the scalar forms (the portable row): one row of widths

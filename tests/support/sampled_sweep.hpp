@@ -11,7 +11,7 @@
 namespace zt {
 
 // How an export takes its destination.
-enum class SampledShape { P3, P3CrFirst, P2, C2, Image420, Image422 };
+enum class SampledShape { P3, P3CrFirst, P2, C2, Image };
 
 constexpr SampledShape sampledShapeOf(std::string_view shape)
 {
@@ -19,8 +19,7 @@ constexpr SampledShape sampledShapeOf(std::string_view shape)
            : shape == "ZOX_SHAPE_TO_P3_CR_FIRST" ? SampledShape::P3CrFirst
            : shape == "ZOX_SHAPE_TO_P2"          ? SampledShape::P2
            : shape == "ZOX_SHAPE_TO_C2"          ? SampledShape::C2
-           : shape == "ZOX_SHAPE_TO_P3_IMAGE420" ? SampledShape::Image420
-                                                 : SampledShape::Image422;
+                                                 : SampledShape::Image;
 }
 
 // The destination planes of a call of width w and height h: each plane's rows and bytes a row, chroma
@@ -41,8 +40,7 @@ std::vector<std::pair<int, int>> sampledPlaneShapes(int w, int h)
 
 // A guarded destination: planes with their own steps and misalignments.
 template <class Dst>
-struct SampledSide {
-    std::vector<std::unique_ptr<Plane>> planes;
+struct SampledSide : PlaneSet {
     uint8_t* ptr[3] = {};
     int step[3] = {};
     SampledSide(int w, int h, int stepKind, int misalign, Rng& rng)
@@ -56,47 +54,20 @@ struct SampledSide {
             step[p] = s;
         }
     }
-    // Packed planes of the members without R (steps width, and the chroma widths).
-    SampledSide(int w, int h, const int (&steps)[3], Rng& rng)
-    {
-        const auto shapes = sampledPlaneShapes<Dst>(w, h);
-        for (std::size_t p = 0; p < shapes.size(); ++p) {
-            planes.push_back(std::make_unique<Plane>(PlaneShape{shapes[p].first, std::max(1, steps[p]), std::max(1, steps[p]), 0}, rng));
-            ptr[p] = planes.back()->data();
-            step[p] = steps[p];
-        }
-    }
     zox::SampledFrame frame(bool crFirst = false) const
     {
-        if constexpr (Dst::planes == 3)
-            return zox::framePlanes3(ptr, step, crFirst);
-        else
+        if constexpr (Dst::planes == 3) {
+            const int a = crFirst ? 2 : 1, b = crFirst ? 1 : 2;
+            return {{ptr[0], ptr[a], ptr[b]}, {step[0], step[a], step[b]}};
+        } else
             return {{ptr[0], ptr[1], nullptr}, {step[0], step[1], 0}};
-    }
-    std::vector<std::vector<uint8_t>> bytes() const
-    {
-        std::vector<std::vector<uint8_t>> b;
-        for (const auto& p : planes)
-            b.push_back(p->bytes());
-        return b;
-    }
-    void restore(const std::vector<std::vector<uint8_t>>& b)
-    {
-        for (std::size_t i = 0; i < planes.size(); ++i)
-            planes[i]->restore(b[i]);
     }
 };
 
 template <class C>
 void passesThrough(zox::KernelSet k, typename C::Src::Arg src, std::ptrdiff_t srcStep, const zox::SampledFrame& f, ImageSize roi)
 {
-    if constexpr (zox::kHaveAvx2)
-        if (k == zox::KernelSet::Avx2)
-            return zox::convertPasses<C, zox::KernelSet::Avx2>(src, srcStep, f, roi);
-    if constexpr (zox::kHaveSse41)
-        if (k == zox::KernelSet::Sse41)
-            return zox::convertPasses<C, zox::KernelSet::Sse41>(src, srcStep, f, roi);
-    zox::convertPasses<C, zox::KernelSet::Portable>(src, srcStep, f, roi);
+    onKernelSet(k, [&]<zox::KernelSet K>() { zox::convertPasses<C, K>(src, srcStep, f, roi); });
 }
 
 // The scalar forms of a row, with the aligned-row forms where the member's rows are aligned.
@@ -135,7 +106,7 @@ void sweepSampled(const char* name, F f)
     using C = typename Row::Other;
     using Src = typename C::Src;
     using Dst = typename C::Dst;
-    static_assert(Sh != SampledShape::Image420 && Sh != SampledShape::Image422);
+    static_assert(Sh != SampledShape::Image);
     Rng rng(4242);
     for (int w = 1; w <= 70; ++w)
         for (int h = 1; h <= 5; ++h) {
@@ -206,17 +177,8 @@ void checkSampledValidation(const char* name, F f)
                          elementsFirst ? zoxStatusNullPointer : zoxStatusBadSize});
     for (const Case& c : cases) {
         SCOPED_TRACE(std::string(name) + ": " + c.what);
-        auto sp = src.ptrs;
-        if (c.srcNull >= 0 && c.srcNull < 9)
-            sp[c.srcNull] = nullptr;
-        typename Src::Arg sa;
-        if constexpr (Src::planes == 1)
-            sa = sp[0];
-        else
-            sa = sp.data();
-        if (c.srcNull == 9)
-            sa = nullptr;
-        const zoxStatus st = callSampled<Row, Sh>(f, sa, src.step, dst, c.roi, c.dstNull);
+        std::vector<typename Src::Sample*> sp;
+        const zoxStatus st = callSampled<Row, Sh>(f, src.argWithNull(c.srcNull, sp), src.step, dst, c.roi, c.dstNull);
         EXPECT_EQ(st, c.want);
         EXPECT_EQ(dst.bytes(), before) << "written before validation passed";
     }
