@@ -136,6 +136,7 @@ inline V madd16(V a, V b) { return _mm_madd_epi16(a, b); }
 // Sampled images: sums of neighbouring 16-bit lanes (wrapping), the 8-byte halves of each lane stored on
 // their own (the next lane's g bytes on), and 16-bit limits.
 inline V hadd(V a, V b) { return _mm_hadd_epi16(a, b); }
+inline V hadd32(V a, V b) { return _mm_hadd_epi32(a, b); }
 inline void storeLowHalves(uint8_t* q, std::size_t, V v) { _mm_storel_epi64(reinterpret_cast<V*>(q), v); }
 inline void storeHighHalves(uint8_t* q, std::size_t, V v) { _mm_storel_epi64(reinterpret_cast<V*>(q), _mm_unpackhi_epi64(v, v)); }
 template <int Byte>

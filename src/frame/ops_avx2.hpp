@@ -142,6 +142,7 @@ inline V madd16(V a, V b) { return _mm256_madd_epi16(a, b); }
 // Sampled images: sums of neighbouring 16-bit lanes within each 128-bit lane (wrapping), the 8-byte
 // halves of each 128-bit lane stored on their own (the upper lane's g bytes on), and 16-bit limits.
 inline V hadd(V a, V b) { return _mm256_hadd_epi16(a, b); }
+inline V hadd32(V a, V b) { return _mm256_hadd_epi32(a, b); }
 inline void storeLowHalves(uint8_t* q, std::size_t g, V v)
 {
     _mm_storel_epi64(reinterpret_cast<__m128i*>(q), _mm256_castsi256_si128(v));

@@ -237,15 +237,26 @@ void scalarUnits(const SourcePass<typename C::Src>& s, const SampledPass& d, int
         storeUnit<C>(d, u, Form::apply(loadUnit<C>(s, u)));
 }
 
-// SIMD kernels of each set: the block form over a prefix of the first n units of a pass; return the units
-// done.
+// SIMD kernels of each set: the block form (or the remainder form) over a prefix of units [from, n) of a
+// pass; return the first unit not done.
 namespace sse41 {
 template <class C>
-int sampledUnits(const SourcePass<typename C::Src>& s, const SampledPass& d, int n);
+int sampledUnits(const SourcePass<typename C::Src>& s, const SampledPass& d, int from, int n, bool remainder);
 }
 namespace avx2 {
 template <class C>
-int sampledUnits(const SourcePass<typename C::Src>& s, const SampledPass& d, int n);
+int sampledUnits(const SourcePass<typename C::Src>& s, const SampledPass& d, int from, int n, bool remainder);
+}
+
+template <class C, KernelSet K>
+int kernelUnits(const SourcePass<typename C::Src>& s, const SampledPass& d, int from, int n, bool remainder)
+{
+    if constexpr (K == KernelSet::Avx2)
+        return avx2::sampledUnits<C>(s, d, from, n, remainder);
+    else if constexpr (K == KernelSet::Sse41)
+        return sse41::sampledUnits<C>(s, d, from, n, remainder);
+    else
+        return from;
 }
 
 template <class C>
@@ -263,15 +274,9 @@ void convertPass(const SourcePass<typename C::Src>& s, const SampledPass& d, int
 {
     const int units = width / C::uw;
     const int nb = blockUnits<C>(width) < units ? blockUnits<C>(width) : units;
-    int u = 0;
-    if constexpr (C::limit != Limit::None) {
-        if constexpr (K == KernelSet::Avx2)
-            u = avx2::sampledUnits<C>(s, d, nb);
-        else if constexpr (K == KernelSet::Sse41)
-            u = sse41::sampledUnits<C>(s, d, nb);
-        scalarUnits<C, typename C::Block>(s, d, u, nb);
-    }
-    scalarUnits<C, typename C::Rem>(s, d, nb, units);
+    if constexpr (C::limit != Limit::None)
+        scalarUnits<C, typename C::Block>(s, d, kernelUnits<C, K>(s, d, 0, nb, false), nb);
+    scalarUnits<C, typename C::Rem>(s, d, kernelUnits<C, K>(s, d, nb, units, true), units);
     if constexpr (C::Tail::writes != 0)
         for (int x = units * C::uw; x < width; ++x) {
             const Px o = C::Tail::apply(C::Src::load(s.r[0], x));
@@ -471,8 +476,8 @@ zoxStatus toPackedPlanes3(SrcArg src, uint8_t* const* dst, ImageSize roi)
 // others.
 #define ZOX_INSTANTIATE_SAMPLED(name, shape, Src, Dst, Lim, Block, Rem, Tail, Rules)                              \
     template int sampledUnits<ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail)::Other>(                            \
-        const ::zox::SourcePass<Src>&, const ::zox::SampledPass&, int);                                             \
+        const ::zox::SourcePass<Src>&, const ::zox::SampledPass&, int, int, bool);                                \
     template int sampledUnits<ZOX_SAMPLED_ROW(Src, Dst, Lim, Block, Rem, Tail)::Spare>(                            \
-        const ::zox::SourcePass<Src>&, const ::zox::SampledPass&, int);
+        const ::zox::SourcePass<Src>&, const ::zox::SampledPass&, int, int, bool);
 
 #define ZOX_DEFINE_SAMPLED(name, shape, Src, Dst, Lim, Block, Rem, Tail, Rules) shape(name, Src, Dst, Lim, Block, Rem, Tail, Rules)

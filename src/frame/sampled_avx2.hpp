@@ -15,9 +15,9 @@ namespace zox::avx2 {
 #include "frame/sampled_simd.inl"
 
 template <class C>
-int sampledUnits(const SourcePass<typename C::Src>& s, const SampledPass& d, int n)
+int sampledUnits(const SourcePass<typename C::Src>& s, const SampledPass& d, int from, int n, bool remainder)
 {
-    return half::sampledGroups<C>(s, d, sampledGroups<C>(s, d, 0, n), n);
+    return half::sampledFormGroups<C>(s, d, sampledFormGroups<C>(s, d, from, n, remainder), n, remainder);
 }
 
 } // namespace zox::avx2

@@ -81,22 +81,31 @@ struct SampledGroupOut<OutSampledC2<G>> {
     }
 };
 
-// The block form over whole groups of units [u, n) of a pass; returns the first unit not done. Each
-// row's lumas are stored as soon as they are formed; the channel sums of its units (pairs of
-// neighbouring lanes) are carried to the chroma.
-template <class C>
+// A form over whole groups of units [u, n) of a pass; returns the first unit not done. Each row's lumas
+// are stored as soon as they are formed; the channel sums of its units (pairs of neighbouring lanes)
+// are carried to the chroma. A form that keeps sums of its own declares `Acc` and forms a row's lumas
+// with `row(acc, r, a, b)`; the others give luma terms, and their sums where they declare `lumaSums`.
+template <class C, class Form>
 int sampledGroups(const SourcePass<typename C::Src>& sIn, const SampledPass& dIn, int u, int n)
 {
-    using F = SimdUnit<typename C::Block>;
+    using F = SimdUnit<Form>;
     using Out = SampledGroupOut<typename C::Dst>;
     constexpr int rows = C::uh;
-    if constexpr (C::variant != 2 && simdUnitPixels<typename C::Block>() == C::uw * C::uh) {
+    if constexpr (C::variant != 2 && simdUnitPixels<Form>() == C::uw * C::uh) {
+        constexpr bool ownSums = requires { typename F::Acc; };
+        using Acc = decltype([] {
+            if constexpr (ownSums)
+                return typename F::Acc{};
+            else
+                return V{};
+        }());
         const SourcePass<typename C::Src> s = sIn;
         const SampledPass d = dIn;
         constexpr int per = kGroupPixels / C::uw;
         for (; u + per <= n; u += per) {
             const int x = C::uw * u;
-            V sum[3], lumaSum = zero(), y = zero();
+            V sum[3], y = zero();
+            Acc acc{};
             #pragma GCC unroll 2
             for (int r = 0; r < rows; ++r) {
                 V3 a, b;
@@ -105,11 +114,15 @@ int sampledGroups(const SourcePass<typename C::Src>& sIn, const SampledPass& dIn
                     F::prepare(a);
                     F::prepare(b);
                 }
-                const V ta = F::luma(a), tb = F::luma(b);
-                y = packUs(F::lumaOut(ta), F::lumaOut(tb));
+                if constexpr (ownSums) {
+                    y = F::row(acc, r, a, b);
+                } else {
+                    const V ta = F::luma(a), tb = F::luma(b);
+                    y = packUs(F::lumaOut(ta), F::lumaOut(tb));
+                    if constexpr (simdLumaSums<Form>())
+                        acc = r == 0 ? hadd(ta, tb) : add(acc, hadd(ta, tb));
+                }
                 Out::luma(d, r, x, y);
-                if constexpr (simdLumaSums<typename C::Block>())
-                    lumaSum = r == 0 ? hadd(ta, tb) : add(lumaSum, hadd(ta, tb));
                 #pragma GCC unroll 3
                 for (int k = 0; k < 3; ++k)
                     sum[k] = r == 0 ? hadd(a.c[k], b.c[k]) : add(sum[k], hadd(a.c[k], b.c[k]));
@@ -118,13 +131,20 @@ int sampledGroups(const SourcePass<typename C::Src>& sIn, const SampledPass& dIn
                 #pragma GCC unroll 3
                 for (int k = 0; k < 3; ++k)
                     sum[k] = hadd(sum[k], sum[k]);
-                if constexpr (simdLumaSums<typename C::Block>())
-                    lumaSum = hadd(lumaSum, lumaSum);
+                if constexpr (simdLumaSums<Form>())
+                    acc = hadd(acc, acc);
             }
             V cb, cr;
-            F::chroma(V3{{sum[0], sum[1], sum[2]}, zero()}, lumaSum, cb, cr);
+            F::chroma(V3{{sum[0], sum[1], sum[2]}, zero()}, acc, cb, cr);
             Out::chroma(d, x, u, cb, cr, y);
         }
     }
     return u;
+}
+
+// The block form (or the remainder form) over whole groups of units [u, n).
+template <class C>
+int sampledFormGroups(const SourcePass<typename C::Src>& s, const SampledPass& d, int u, int n, bool remainder)
+{
+    return remainder ? sampledGroups<C, typename C::Rem>(s, d, u, n) : sampledGroups<C, typename C::Block>(s, d, u, n);
 }

@@ -9,9 +9,9 @@ namespace zox::sse41 {
 #include "frame/sampled_simd.inl"
 
 template <class C>
-int sampledUnits(const SourcePass<typename C::Src>& s, const SampledPass& d, int n)
+int sampledUnits(const SourcePass<typename C::Src>& s, const SampledPass& d, int from, int n, bool remainder)
 {
-    return sampledGroups<C>(s, d, 0, n);
+    return sampledFormGroups<C>(s, d, from, n, remainder);
 }
 
 } // namespace zox::sse41

@@ -195,3 +195,43 @@ struct SimdUnit<YuvD257Block> {
         cr = add(shr<1>(mulHigh(sub(shr<1>(s.c[0]), t), splat16<K::vGain>())), splat16<128>());
     }
 };
+
+// Y16, unit of 4: whole-sample luma terms t in 32-bit lanes, through pair multiply-adds (38470 green as
+// two halves of 19235); the units' sums of t carried in 32-bit lanes to the differences
+// d = floor((65536 Sum - sum of t + 131071) / 65536), which fit 16 bits. U = floor(32244 d / 262144) + 128,
+// and V with 57475 d formed as 65536 d - 8061 d.
+template <>
+struct SimdUnit<YuvY16Unit> {
+    static constexpr int pixels = 4;
+    struct Acc {
+        V lo, hi; // sums of t of units 0..3 and 4..7 of each lane
+    };
+    // t of pixels 0..3 and 4..7 of v; returns Y of all eight.
+    static V terms(const V3& v, V& lo, V& hi)
+    {
+        const V rg = splat32<19595 | (19235 << 16)>(), bg = splat32<7471 | (19235 << 16)>();
+        lo = add32(madd16(unpackLo16(v.c[0], v.c[1]), rg), madd16(unpackLo16(v.c[2], v.c[1]), bg));
+        hi = add32(madd16(unpackHi16(v.c[0], v.c[1]), rg), madd16(unpackHi16(v.c[2], v.c[1]), bg));
+        return packs32(shr32<16>(lo), shr32<16>(hi));
+    }
+    static V row(Acc& acc, int r, const V3& a, const V3& b)
+    {
+        V a0, a1, b0, b1;
+        const V ya = terms(a, a0, a1), yb = terms(b, b0, b1);
+        const V lo = hadd32(a0, a1), hi = hadd32(b0, b1);
+        acc.lo = r == 0 ? lo : add32(acc.lo, lo);
+        acc.hi = r == 0 ? hi : add32(acc.hi, hi);
+        return packUs(ya, yb);
+    }
+    static V difference(V sum, const Acc& acc)
+    {
+        auto part = [](V s32, V t) { return shr32<16>(add32(sub32(shl32<16>(s32), t), splat32<131071>())); };
+        return packs32(part(unpackLo16(sum, zero()), acc.lo), part(unpackHi16(sum, zero()), acc.hi));
+    }
+    static void chroma(const V3& s, const Acc& acc, V& cb, V& cr)
+    {
+        const V db = difference(s.c[2], acc), dr = difference(s.c[0], acc);
+        cb = add(shr<2>(mulHigh(db, splat16<32244>())), splat16<128>());
+        cr = add(shr<2>(add(dr, mulHigh(dr, splat16<-8061>()))), splat16<128>());
+    }
+};
