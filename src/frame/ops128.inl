@@ -137,6 +137,15 @@ inline V madd16(V a, V b) { return _mm_madd_epi16(a, b); }
 // their own (the next lane's g bytes on), and 16-bit limits.
 inline V hadd(V a, V b) { return _mm_hadd_epi16(a, b); }
 inline V hadd32(V a, V b) { return _mm_hadd_epi32(a, b); }
+// Filters over neighbouring 32-bit lanes: lanes 1 and 3 of a then of b; lane 3 of prev followed by lanes
+// 0..2 of v; the vector of the previous group (of the previous turn, one lane a turn here); a constant
+// of alternating lanes E, O; a runtime constant.
+inline V oddLanes32(V a, V b) { return _mm_castps_si128(_mm_shuffle_ps(_mm_castsi128_ps(a), _mm_castsi128_ps(b), 0xDD)); }
+inline V shiftIn32(V v, V prev) { return _mm_alignr_epi8(v, prev, 12); }
+inline V previousGroup(V lastTurn, V) { return lastTurn; }
+template <int E, int O>
+inline V alternate32() { return _mm_set_epi32(O, E, O, E); }
+inline V splat32(int k) { return _mm_set1_epi32(k); }
 inline void storeLowHalves(uint8_t* q, std::size_t, V v) { _mm_storel_epi64(reinterpret_cast<V*>(q), v); }
 inline void storeHighHalves(uint8_t* q, std::size_t, V v) { _mm_storel_epi64(reinterpret_cast<V*>(q), _mm_unpackhi_epi64(v, v)); }
 template <int Byte>

@@ -143,6 +143,15 @@ inline V madd16(V a, V b) { return _mm256_madd_epi16(a, b); }
 // halves of each 128-bit lane stored on their own (the upper lane's g bytes on), and 16-bit limits.
 inline V hadd(V a, V b) { return _mm256_hadd_epi16(a, b); }
 inline V hadd32(V a, V b) { return _mm256_hadd_epi32(a, b); }
+// Filters over neighbouring 32-bit lanes, within each 128-bit lane: lanes 1 and 3 of a then of b; lane 3
+// of prev followed by lanes 0..2 of v; the vector of the previous group (the upper lane of the last turn,
+// then the lower lane of this one); a constant of alternating lanes E, O; a runtime constant.
+inline V oddLanes32(V a, V b) { return _mm256_castps_si256(_mm256_shuffle_ps(_mm256_castsi256_ps(a), _mm256_castsi256_ps(b), 0xDD)); }
+inline V shiftIn32(V v, V prev) { return _mm256_alignr_epi8(v, prev, 12); }
+inline V previousGroup(V lastTurn, V thisTurn) { return _mm256_permute2x128_si256(lastTurn, thisTurn, 0x21); }
+template <int E, int O>
+inline V alternate32() { return _mm256_set_epi32(O, E, O, E, O, E, O, E); }
+inline V splat32(int k) { return _mm256_set1_epi32(k); }
 inline void storeLowHalves(uint8_t* q, std::size_t g, V v)
 {
     _mm_storel_epi64(reinterpret_cast<__m128i*>(q), _mm256_castsi256_si128(v));

@@ -151,13 +151,15 @@ struct OutSampledC2 {
 };
 
 // A source whose samples go through an 8-bit table first.
-template <class Src, class Map>
+template <class Src, class Map_>
 struct InMapped : Src {
+    using Base = Src;
+    using Map = Map_;
     static Px load(const typename Src::Row& row, int x)
     {
         Px p = Src::load(row, x);
         for (int k = 0; k < 3; ++k)
-            p.c[k] = Map::apply(p.c[k]);
+            p.c[k] = Map_::apply(p.c[k]);
         return p;
     }
 };

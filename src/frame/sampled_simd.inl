@@ -91,7 +91,9 @@ int sampledGroups(const SourcePass<typename C::Src>& sIn, const SampledPass& dIn
     using F = SimdUnit<Form>;
     using Out = SampledGroupOut<typename C::Dst>;
     constexpr int rows = C::uh;
-    if constexpr (C::variant != 2 && simdUnitPixels<Form>() == C::uw * C::uh) {
+    if constexpr (requires { F::template groups<C>(sIn, dIn, u, n); }) { // a form with a walk of its own
+        return F::template groups<C>(sIn, dIn, u, n);
+    } else if constexpr (C::variant != 2 && simdUnitPixels<Form>() == C::uw * C::uh) {
         constexpr bool ownSums = requires { typename F::Acc; };
         using Acc = decltype([] {
             if constexpr (ownSums)

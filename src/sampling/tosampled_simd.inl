@@ -235,3 +235,89 @@ struct SimdUnit<YuvY16Unit> {
         cr = add(shr<2>(add(dr, mulHigh(dr, splat16<-8061>()))), splat16<128>());
     }
 };
+
+// The three-tap filter: luma and the full and half chroma terms of each pixel in 32-bit lanes through
+// pair multiply-adds (full terms in even lanes, half terms in odd ones), summed per pair; the left half
+// term of a pair is the odd lane of the pair before, carried across groups (none at the start of a row).
+// Three-byte RGB sources, or such samples through a table (each turn's bytes mapped into a buffer first).
+// The source a mapped source reads (void for others).
+template <class S>
+struct MappedBase {
+    using type = void;
+};
+template <class S, class M>
+struct MappedBase<InMapped<S, M>> {
+    using type = S;
+};
+
+template <>
+struct SimdUnit<YccTapFilter> {
+    using T = YccTapFilter;
+    // Terms of pixels 0..7 of v: Y (16-bit lanes), and per pair k the full plus right half term of Cb and
+    // Cr (units 0..3) and the odd pixels' half terms.
+    struct Half {
+        V y, cb, cr, hb, hr;
+    };
+    template <int fR, int fG, int fB, int hR, int hG, int hB>
+    static void chroma(V rgLo, V rgHi, V bLo, V bHi, V& pairs, V& odd)
+    {
+        const V rg = alternate32<(fR & 0xFFFF) | (fG << 16), (hR & 0xFFFF) | (hG << 16)>(), b = alternate32<fB, hB>();
+        const V lo = add32(madd16(rgLo, rg), madd16(bLo, b)), hi = add32(madd16(rgHi, rg), madd16(bHi, b));
+        pairs = hadd32(lo, hi);
+        odd = oddLanes32(lo, hi);
+    }
+    static Half terms(const V3& v)
+    {
+        const V rgLo = unpackLo16(v.c[0], v.c[1]), rgHi = unpackHi16(v.c[0], v.c[1]);
+        const V bLo = unpackLo16(v.c[2], zero()), bHi = unpackHi16(v.c[2], zero());
+        // Y: (R, G) and (B, 32) against (8422, 16515) and (3212, 16896): 16896 x 32 is the 540672.
+        const V ky = splat32<8422 | (16515 << 16)>(), kb = splat32<3212 | (16896 << 16)>(), c32 = splat16<32>();
+        const V ylo = shr32<15>(add32(madd16(rgLo, ky), madd16(unpackLo16(v.c[2], c32), kb)));
+        const V yhi = shr32<15>(add32(madd16(rgHi, ky), madd16(unpackHi16(v.c[2], c32), kb)));
+        Half h;
+        h.y = packs32(ylo, yhi);
+        chroma<-2426, -4769, 7193, -1213, -2385, 3596>(rgLo, rgHi, bLo, bHi, h.cb, h.hb);
+        chroma<7193, -6030, -1164, 3596, -3015, -582>(rgLo, rgHi, bLo, bHi, h.cr, h.hr);
+        return h;
+    }
+    static V finish(V pairs, V left) { return shr32<15>(add32(add32(pairs, left), splat32<4210687>())); }
+    template <class C>
+    static int groups(const SourcePass<typename C::Src>& sIn, const SampledPass& dIn, int u, int n)
+    {
+        using Src = typename C::Src;
+        constexpr bool mapped = requires { typename Src::Map; };
+        if constexpr (std::is_same_v<Src, InC3> || std::is_same_v<typename MappedBase<Src>::type, InC3>) {
+            using Out = SampledGroupOut<typename C::Dst>;
+            const SourcePass<typename C::Src> s = sIn;
+            const SampledPass d = dIn;
+            V lastB = zero(), lastR = zero(); // the half terms of the pixel left of this turn's first pair
+            if (u > 0) {
+                const Px left = C::Src::load(s.r[0], 2 * u - 1);
+                lastB = splat32(T::hb(left));
+                lastR = splat32(T::hr(left));
+            }
+            constexpr int per = kGroupPixels / 2;
+            for (; u + per <= n; u += per) {
+                const int x = 2 * u;
+                V3 a, b;
+                if constexpr (mapped) {
+                    alignas(32) uint8_t bytes[3 * kGroupPixels];
+                    const uint8_t* q = s.r[0].p[0] + 3 * static_cast<std::size_t>(x);
+                    for (int i = 0; i < 3 * kGroupPixels; ++i)
+                        bytes[i] = static_cast<uint8_t>(Src::Map::apply(q[i]));
+                    GroupIo<InC3>::template get<0>(InC3::Row{{bytes}}, 0, a, b);
+                } else {
+                    GroupIo<InC3>::template get<0>(s.r[0], x, a, b);
+                }
+                const Half ha = terms(a), hb = terms(b);
+                const V prevB = previousGroup(lastB, hb.hb), prevR = previousGroup(lastR, hb.hr);
+                const V cb = packs32(finish(ha.cb, shiftIn32(ha.hb, prevB)), finish(hb.cb, shiftIn32(hb.hb, ha.hb)));
+                const V cr = packs32(finish(ha.cr, shiftIn32(ha.hr, prevR)), finish(hb.cr, shiftIn32(hb.hr, ha.hr)));
+                Out::chroma(d, x, u, cb, cr, packUs(ha.y, hb.y));
+                lastB = hb.hb;
+                lastR = hb.hr;
+            }
+        }
+        return u;
+    }
+};
