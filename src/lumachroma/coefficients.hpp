@@ -33,6 +33,10 @@ inline constexpr YuvInverseGains YuvInverseTruncated{74710, -25820, -38075, 1331
 inline constexpr YuvInverseGains YuvInverseBlock8{9339, -3228, -4760, 16646};        // 1/8192
 inline constexpr YuvInverseGains YuvInverseBlock16{9338, -3227, -4759, 16645};       // 1/8192
 inline constexpr YuvInverseGains YuvInverseBlock128{4669, -1614, -2380, 8323};       // 1/4096
+// The sampled members' wide block sets, on 128 x chroma in a multiply-high, the sum over 16: Y enters as
+// 16 Y with no offset. The mixed set takes Cb to B from the 8-bit block set, the rest from the 16-bit one.
+inline constexpr YuvInverseGains YuvInverseBlockMixed{9338, -3227, -4759, 16646};
+inline constexpr YuvInverseGains Ycc709FullInverseBlock{12616, -1499, -3760, 14877};
 
 // ---- YCbCr: studio range, Y 16..235, Cb and Cr 16..240 around 128 ------------------------------------
 
@@ -69,15 +73,33 @@ inline constexpr YccForwardMagnitudes YccForwardRound{4211, 8258, 1606, 2425, 47
 // Inverse gains of y = Y - 16, u = Cb - 128 and v = Cr - 128.
 struct YccInverseGains {
     int y, vR, uG, vG, uB;
+    bool full = false; // full-range luma: the gain y acts on Y itself
 };
 // Whole-sample sets, in 1/65536.
 inline constexpr YccInverseGains YccInversePixelA{76284, 104595, -25690, -53281, 132186};
 inline constexpr YccInverseGains YccInversePixelB{76282, 104593, -25689, -53279, 132184};
+inline constexpr YccInverseGains YccInversePixel709{76284, 117506, -13959, -34996, 138609};
+inline constexpr YccInverseGains YccInversePixel709Full{65536, 100925, -11993, -30081, 119013, true};
+// The 4:1:1 remainder set: near YccInversePixelA, with its own luma gain and Cb to green.
+inline constexpr YccInverseGains YccInversePixel411{76294, 104595, -25625, -53281, 132186};
 // Block sets, in 1/8192 overall: each gain multiplies 128 x value in a multiply-high, and the sum is
 // divided by 16. A and B differ in the luma gain and in Cb to green.
 inline constexpr YccInverseGains YccInverseBlockA{9536, 13074, -3203, -6660, 16523};
 inline constexpr YccInverseGains YccInverseBlockB{9535, 13074, -3211, -6660, 16523};
 // The BT.709 block set, scaled as the 601 block sets.
 inline constexpr YccInverseGains Ycc709InverseBlock{9535, 14688, -1745, -4375, 17326};
+
+// Folded and split sets of the sampled members, on 128 x sample in a multiply-high, the sum over 8. A
+// folded set carries the offsets of Y, Cb and Cr in three constants (subtracted from the B, R and G
+// terms), so that the raw samples go in; a split set takes y, u and v and has none.
+struct YccFoldedGains {
+    int y, cbB, crR, cbG, crG;
+    int kB = 0, kR = 0, kG = 0;
+};
+inline constexpr YccFoldedGains YccFoldedA{4769, 8263, 6537, 1605, 3330, 2211, 1779, 1089};
+inline constexpr YccFoldedGains YccFoldedB{4768, 8262, 6537, 1606, 3330, 2210, 1779, 1084};
+inline constexpr YccFoldedGains YccFoldedC{4768, 8262, 6537, 1606, 3330, 2214, 1783, 1085};
+inline constexpr YccFoldedGains YccSplitA{4767, 8261, 6537, 1605, 3330};
+inline constexpr YccFoldedGains YccSplitB{4769, 8263, 6537, 1605, 3330};
 
 } // namespace zox

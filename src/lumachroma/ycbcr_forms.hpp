@@ -74,12 +74,12 @@ struct RgbFromYccBlock {
     }
 };
 
-// Whole-sample sets in 1/65536, R = 32768 rounded or 0 truncated.
+// Whole-sample sets in 1/65536, R = 32768 rounded or 0 truncated; a full-range set's gain acts on Y.
 template <const YccInverseGains& K, int R>
 struct RgbFromYccPixel {
     static Px apply(const Px& p)
     {
-        const int y = K.y * (p.c[0] - 16), u = p.c[1] - 128, v = p.c[2] - 128;
+        const int y = K.y * (K.full ? p.c[0] : p.c[0] - 16), u = p.c[1] - 128, v = p.c[2] - 128;
         return {{clip8((y + K.vR * v + R) >> 16), clip8((y + K.uG * u + K.vG * v + R) >> 16), clip8((y + K.uB * u + R) >> 16)}, p.extra};
     }
 };

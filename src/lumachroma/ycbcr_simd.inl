@@ -45,20 +45,7 @@ struct Simd<YccFromRgbRound> {
 
 template <const YccInverseGains& K, Rounding Rd, Green G>
 struct Simd<RgbFromYccBlock<K, Rd, G>> {
-    static void apply(V3& v)
-    {
-        const V luma = add(mulHigh(shl<7>(sub(v.c[0], splat16<16>())), splat16<K.y>()),
-                           splat16<RgbFromYccBlock<K, Rd, G>::bias>());
-        const V a = shl<7>(sub(v.c[1], splat16<128>())), b = shl<7>(sub(v.c[2], splat16<128>()));
-        V green;
-        if constexpr (G == Green::Sum)
-            green = add(add(luma, mulHigh(a, splat16<K.uG>())), mulHigh(b, splat16<K.vG>()));
-        else
-            green = sub(sub(luma, mulHigh(b, splat16<-K.vG>())), mulHigh(a, splat16<-K.uG>()));
-        v.c[0] = shr<4>(add(luma, mulHigh(b, splat16<K.vR>())));
-        v.c[1] = shr<4>(green);
-        v.c[2] = shr<4>(add(luma, mulHigh(a, splat16<K.uB>())));
-    }
+    static void apply(V3& v) { applyInverse<RgbFromYccBlock<K, Rd, G>>(v); }
 };
 
 // ---- whole-row forms over 32-bit lanes ----------------------------------------------------------------

@@ -84,9 +84,9 @@ struct RgbFromYuvBlock8 {
     }
 };
 
-// Block 16: chroma scaled by 16, luma doubled, the sum halved.
-struct RgbFromYuvBlock16 {
-    static constexpr YuvInverseGains K = YuvInverseBlock16;
+// Block 16: chroma scaled by 16, luma doubled, the sum halved (gains in 1/8192).
+template <const YuvInverseGains& K>
+struct RgbFromYuvBlock16With {
     static Px apply(const Px& p)
     {
         const int y2 = 2 * p.c[0], a = 16 * (p.c[1] - 128), b = 16 * (p.c[2] - 128);
@@ -95,6 +95,7 @@ struct RgbFromYuvBlock16 {
                 p.extra};
     }
 };
+using RgbFromYuvBlock16 = RgbFromYuvBlock16With<YuvInverseBlock16>;
 
 // Block 128: chroma scaled by 128, luma by 8, rounded. Green subtracts products formed with positive
 // gains, so each of its floors falls the other way from a negative gain.

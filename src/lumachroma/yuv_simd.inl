@@ -51,17 +51,9 @@ struct Simd<RgbFromYuvBlock8> {
     }
 };
 
-template <>
-struct Simd<RgbFromYuvBlock16> {
-    static constexpr YuvInverseGains K = YuvInverseBlock16;
-    static void apply(V3& v)
-    {
-        const V y2 = shl<1>(v.c[0]);
-        const V a = shl<4>(sub(v.c[1], splat16<128>())), b = shl<4>(sub(v.c[2], splat16<128>()));
-        v.c[0] = shr<1>(add(y2, mulHigh(b, splat16<K.vR>())));
-        v.c[1] = shr<1>(add(add(y2, mulHigh(a, splat16<K.uG>())), mulHigh(b, splat16<K.vG>())));
-        v.c[2] = shr<1>(add(y2, mulHigh(a, splat16<K.uB>())));
-    }
+template <const YuvInverseGains& K>
+struct Simd<RgbFromYuvBlock16With<K>> {
+    static void apply(V3& v) { applyInverse<RgbFromYuvBlock16With<K>>(v); }
 };
 
 template <>

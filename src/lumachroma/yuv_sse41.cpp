@@ -1,8 +1,10 @@
 // SSE4.1 block kernels of the RGB <-> YUV family.
 #include "frame/conv_sse41.hpp"
+#include "lumachroma/ycbcr_forms.hpp"
 #include "lumachroma/yuv_table.hpp"
 
 namespace zox::sse41 {
+#include "lumachroma/inverse_simd.inl"
 #include "lumachroma/yuv_simd.inl"
 
 ZOX_YUV_TABLE(ZOX_INSTANTIATE_KERNELS)
