@@ -216,6 +216,75 @@ ZOXCC_API zoxStatus zoxiBGRToCbYCr422_709HDTV_8u_C3C2R(const uint8_t* src, int s
 ZOXCC_API zoxStatus zoxiRGBToCbYCr422_8u_C3C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
 ZOXCC_API zoxStatus zoxiRGBToCbYCr422Gamma_8u_C3C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
 
+/* ---- Chroma-sampled YCbCr and YUV to RGB, 8u: 4:2:0, 4:2:2, 4:1:1 --------------------------------------
+ * roiSize counts luma pixels. Chroma is replicated: every pixel of a unit (4:2:0: 2x2, 4:2:2: 2x1, 4:1:1:
+ * 4x1) takes the unit's Cb and Cr unchanged. BGR names write B,G,R; C4 writes alpha fourth, AC4 writes 0;
+ * P3 destinations (P3R, C2P3R) are R, G, B planes with one step.
+ * Sources: P3 three planes Y, Cb, Cr (YCrCb names: Y, Cr, Cb, srcStep in the same order); chroma planes
+ * 4:2:0 width/2 x height/2, 4:2:2 (width+1)/2 x height, 4:1:1 width/4 x height. P2: Y, then Cb,Cr pairs
+ * (YCrCb names: Cr,Cb). C2: 4 bytes for 2 pixels, YCbCr422 and YUV422 Y0 Cb Y1 Cr, YCrCb422 Y0 Cr Y1 Cb,
+ * CbYCr422 Cb Y0 Cr Y1.
+ * Matrix and range: YUV full range (BT.601 analogue weights); YCbCr studio range BT.601, 709CSC studio
+ * BT.709, 709HDTV full-range BT.709. Pixels before each member's limit column take its block form, the
+ * others a remainder form (values differ by a unit at most).
+ * Odd sizes: 4:2:0 converts whole 2x2 units only (a last odd row and column are left untouched, a region
+ * one pixel wide or high writes nothing). C2, odd width: the last pixel takes its own chroma byte and the
+ * other from the group before (width 1: its one byte as both). P3 4:2:2, odd width: the last pixel takes
+ * its own samples (YCbCr422ToBGR_8u_P3C3R leaves it). 4:1:1: the up to 3 pixels behind the last unit
+ * take that unit's chroma.
+ * YCbCr420ToBGR_8u_P3C3R and YCbCr422ToRGB_8u_P3C3R: rows whose pointers and steps are all multiples of 16
+ * take their own block form, which may differ by a unit from the others'.
+ * Without R: packed planes, source steps width and width/2 (4:2:2: width/2 rounded up), destination
+ * steps width (P3) or 3 width; a 4:2:2 image of even width and 256 pixels or more is converted as one row.
+ * Minimum sizes: YCbCr411 width 4, YCbCr422ToBGR (C2C3R, C2C4R, P3C3R) width 2, YUV420ToBGR 2x2, others
+ * 1x1. zoxWarnOddSize with the finished result: 4:2:0 width or height odd.
+ * Checks: src and dst, sizes, then array elements; YCbCr411 and YCbCr422ToBGR_8u_P3C3R every pointer
+ * (elements included) first; the two YCrCb420 P2C4R members sizes first. Steps are not examined. */
+ZOXCC_API zoxStatus zoxiYCbCr420ToBGR_8u_P2C3R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToBGR_8u_P2C4R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCbCr420ToRGB_8u_P2C3R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToRGB_8u_P2C4R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCbCr420ToBGR_8u_P3C4R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCrCb420ToBGR_8u_P2C3R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb420ToBGR_8u_P2C4R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCrCb420ToRGB_8u_P2C3R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb420ToRGB_8u_P2C4R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCbCr420ToBGR_8u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToRGB_8u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb420ToRGB_8u_P3C4R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCbCr420ToBGR_709CSC_8u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToBGR_709HDTV_8u_P3C4R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYUV420ToBGR_8u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToRGB_8u_P3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToRGB_8u_P3(const uint8_t* const src[3], uint8_t* const dst[3], ImageSize imageSize);
+ZOXCC_API zoxStatus zoxiYUV420ToRGB_8u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToRGB_8u_P3C3(const uint8_t* const src[3], uint8_t* dst, ImageSize imageSize);
+ZOXCC_API zoxStatus zoxiYUV420ToRGB_8u_P3AC4R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB_8u_C2C4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCrCb422ToRGB_8u_C2C4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCrCb422ToBGR_8u_C2C4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCrCb422ToRGB_8u_C2C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb422ToBGR_8u_C2C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR_8u_C2C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR_8u_C2C4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB_8u_C2C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb422ToRGB_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiCbYCr422ToBGR_709HDTV_8u_C2C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiCbYCr422ToBGR_709HDTV_8u_C2C4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiCbYCr422ToBGR_8u_C2C4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiCbYCr422ToRGB_8u_C2C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR_8u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB_8u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV422ToRGB_8u_C2C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV422ToRGB_8u_P3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* const dst[3], int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV422ToRGB_8u_P3(const uint8_t* const src[3], uint8_t* const dst[3], ImageSize imageSize);
+ZOXCC_API zoxStatus zoxiYUV422ToRGB_8u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV422ToRGB_8u_P3C3(const uint8_t* const src[3], uint8_t* dst, ImageSize imageSize);
+ZOXCC_API zoxStatus zoxiYUV422ToRGB_8u_P3AC4R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToBGR_8u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToBGR_8u_P3C4R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+
 /* ---- Gamma correction, 8u / 16u / 32f ----------------------------------------------------------------
  * The BT.709 transfer curve, forward (linear to encoded) or inverse, on every colour sample. 8u reads a
  * constant table; 16u evaluates the curve in double precision per sample, or through a 65536-entry table

@@ -21,12 +21,14 @@ struct NoBlock {};
 enum class Checks {
     PointersSizesPlanes, // src/dst null, sizes, then every plane pointer
     PointersPlanesSizes, // src/dst and every plane pointer, then sizes
-    PointersPlanesEmpty  // src/dst and every plane pointer; a size below 1 converts nothing and is no error
+    PointersPlanesEmpty, // src/dst and every plane pointer; a size below 1 converts nothing and is no error
+    SizesPointersPlanes  // sizes, then src/dst and every plane pointer
 };
 // Short names for the table rows.
 inline constexpr Checks PlanesLast = Checks::PointersSizesPlanes;
 inline constexpr Checks PlanesFirst = Checks::PointersPlanesSizes;
 inline constexpr Checks PlanesFirstEmptyOk = Checks::PointersPlanesEmpty;
+inline constexpr Checks SizesFirst = Checks::SizesPointersPlanes;
 
 template <class Src_, class Dst_, int N_, class Block_, class Rem_, Checks C_>
 struct Conv {
@@ -109,6 +111,9 @@ void convertRows(typename C::Src::Arg src, int srcStep, typename C::Dst::Arg dst
 template <Checks C, class Elements>
 zoxStatus checkArguments(bool pointers, Elements elements, bool sizesOk)
 {
+    if constexpr (C == Checks::SizesPointersPlanes)
+        if (!sizesOk)
+            return zoxStatusBadSize;
     if (!pointers)
         return zoxStatusNullPointer;
     if constexpr (C != Checks::PointersSizesPlanes)

@@ -31,6 +31,39 @@ constexpr int inputShiftOf()
 template <class Form>
 inline constexpr int inputShift = inputShiftOf<Form>();
 
+// A form from Y, Cb, Cr to R, G, B in two parts, so that chroma can be formed once for every pixel that
+// shares it: `luma(y)` gives each pixel's luma term from Y, `chroma(cb, cr)` the R, G and B terms from
+// the raw chroma samples (all in the low byte of 16-bit lanes), and each channel is (luma term + chroma
+// term) >> shift before clip8.
+struct InverseTerms {
+    V r, g, b;
+};
+
+template <class Form>
+struct InverseSimd;
+
+template <class Form>
+inline V inverseChannel(V luma, V term)
+{
+    constexpr int s = InverseSimd<Form>::shift;
+    if constexpr (s == 0)
+        return add(luma, term);
+    else
+        return shr<s>(add(luma, term));
+}
+
+// The form on whole pixels (full-resolution rows): Y, Cb, Cr in, R, G, B out before clip8.
+template <class Form>
+inline void applyInverse(V3& v)
+{
+    using F = InverseSimd<Form>;
+    const InverseTerms t = F::chroma(v.c[1], v.c[2]);
+    const V l = F::luma(v.c[0]);
+    v.c[0] = inverseChannel<Form>(l, t.r);
+    v.c[1] = inverseChannel<Form>(l, t.g);
+    v.c[2] = inverseChannel<Form>(l, t.b);
+}
+
 // The kernel of a form that has no hand-written SIMD form (it declares `compilerVectorised`): the form
 // itself over the block columns, compiled with this set's flags and vectorised by the compiler. Every
 // call inside is inlined (flatten), so that no shared inline function is emitted with this set's

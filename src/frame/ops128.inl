@@ -83,6 +83,15 @@ template <int S> inline V shr32(V a) { return _mm_srai_epi32(a, S); } // arithme
 template <int S> inline V shrU32(V a) { return _mm_srli_epi32(a, S); }
 inline V and_(V a, V b) { return _mm_and_si128(a, b); }
 inline V packs32(V a, V b) { return _mm_packs_epi32(a, b); } // to 16 bits, saturating
+// Bytes of a plane widened to 16-bit lanes, N of them a lane (8, or 4 in the lane's low half).
+template <int N>
+inline V loadUnits(const uint8_t* q)
+{
+    if constexpr (N == 8)
+        return _mm_cvtepu8_epi16(load8(q));
+    else
+        return _mm_cvtepu8_epi16(load4(q));
+}
 // Four-byte pixels, one a lane: four of them.
 inline V loadWidePixels4(const uint8_t* q) { return load16(q); }
 // Bytes of a plane widened to 32-bit lanes, and 32-bit lanes limited to 0..255 (clip8) back to bytes,

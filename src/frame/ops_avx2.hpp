@@ -89,6 +89,18 @@ template <int S> inline V shrU32(V a) { return _mm256_srli_epi32(a, S); }
 inline V and_(V a, V b) { return _mm256_and_si256(a, b); }
 // Within each 128-bit lane, as the 128-bit set: pixels 0..3 stay in the lower lane, 4..7 in the upper.
 inline V packs32(V a, V b) { return _mm256_packs_epi32(a, b); }
+// Bytes of a plane widened to 16-bit lanes, N of them a lane (8, or 4 in the lane's low half): the
+// first N bytes to the lower lane, the next N to the upper one.
+template <int N>
+inline V loadUnits(const uint8_t* q)
+{
+    if constexpr (N == 8) {
+        return _mm256_cvtepu8_epi16(_mm_loadu_si128(reinterpret_cast<const __m128i*>(q)));
+    } else {
+        const __m128i x = _mm_loadl_epi64(reinterpret_cast<const __m128i*>(q));
+        return _mm256_cvtepu8_epi16(_mm_unpacklo_epi64(x, _mm_srli_si128(x, 4)));
+    }
+}
 inline V loadWidePixels4(const uint8_t* q) { return _mm256_loadu_si256(reinterpret_cast<const V*>(q)); }
 template <int M>
 inline void widenBytes(const uint8_t* q, V (&v)[M])

@@ -51,6 +51,9 @@ enum class Limit {
     All,  // one form in every column
     L16,  // W rounded down to 16
     L8,   // W rounded down to 8
+    L4,   // W rounded down to 4
+    L4P3, // W rounded down to 4, plus 3 when W mod 4 is 3
+    Even, // W rounded down to 2
     LB,   // W rounded down to 16, plus 4 when W mod 8 is at least 4
     LC    // W rounded down to 32, plus 8 when W mod 16 is at least 8
 };
@@ -61,6 +64,9 @@ constexpr int limitColumn(Limit l, int w)
     case Limit::All: return w;
     case Limit::L16: return w & ~15;
     case Limit::L8: return w & ~7;
+    case Limit::L4: return w & ~3;
+    case Limit::L4P3: return (w & ~3) + ((w & 3) == 3 ? 3 : 0);
+    case Limit::Even: return w & ~1;
     case Limit::LB: return (w & ~15) + ((w & 7) >= 4 ? 4 : 0);
     case Limit::LC: return (w & ~31) + ((w & 15) >= 8 ? 8 : 0);
     }

@@ -1,38 +1,7 @@
-// The inverse block forms (YCbCr or YUV to RGB) over 16-bit lanes, in two parts so that chroma can be
-// formed once for every pixel that shares it: `luma(y)` gives each pixel's luma term from Y, `chroma(cb,
-// cr)` the R, G and B terms from the raw chroma samples (all in the low byte of 16-bit lanes), and each
-// channel is (luma term + chroma term) >> shift before clip8. Rounding units sit in the chroma terms. No
-// sum leaves the signed 16-bit range, and the 16-bit adds wrap alike in any order, so the parts give the
-// form's values exactly. Included inside the namespace of each instruction set after its vocabulary.
-
-struct InverseTerms {
-    V r, g, b;
-};
-
-template <class Form>
-struct InverseSimd;
-
-template <class Form>
-inline V inverseChannel(V luma, V term)
-{
-    constexpr int s = InverseSimd<Form>::shift;
-    if constexpr (s == 0)
-        return add(luma, term);
-    else
-        return shr<s>(add(luma, term));
-}
-
-// The form on whole pixels (full-resolution rows): Y, Cb, Cr in, R, G, B out before clip8.
-template <class Form>
-inline void applyInverse(V3& v)
-{
-    using F = InverseSimd<Form>;
-    const InverseTerms t = F::chroma(v.c[1], v.c[2]);
-    const V l = F::luma(v.c[0]);
-    v.c[0] = inverseChannel<Form>(l, t.r);
-    v.c[1] = inverseChannel<Form>(l, t.g);
-    v.c[2] = inverseChannel<Form>(l, t.b);
-}
+// The inverse block forms (YCbCr or YUV to RGB) over 16-bit lanes, as luma and chroma parts (InverseSimd,
+// see io_simd.inl). Rounding units sit in the chroma terms. No sum leaves the signed 16-bit range, and
+// the 16-bit adds wrap alike in any order, so the parts give the form's values exactly. Included inside
+// the namespace of each instruction set after its vocabulary.
 
 template <const YccInverseGains& K, Rounding Rd, Green G>
 struct InverseSimd<RgbFromYccBlock<K, Rd, G>> {
