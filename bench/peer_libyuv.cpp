@@ -35,6 +35,17 @@ void samplePeer(const char* name, std::vector<std::string> ours, Size size, int 
     });
 }
 
+// One conversion of libyuv from a sampled image of `inBytes` to a packed destination of `outBytes`.
+void unsamplePeer(const char* name, std::vector<std::string> ours, Size size, std::size_t inBytes, std::size_t outBytes,
+                  void (*call)(const uint8_t*, uint8_t*, Size))
+{
+    registerPeer(name, ours, size, inBytes + outBytes, [inBytes, outBytes, call](Size s) -> Call {
+        auto in = std::make_shared<std::vector<uint8_t>>(randomBytes(inBytes + 64));
+        auto out = std::make_shared<std::vector<uint8_t>>(outBytes + 64);
+        return [in, out, s, call] { call(in->data(), out->data(), s); };
+    });
+}
+
 } // namespace
 
 void registerLibyuvPeers()
@@ -66,6 +77,28 @@ void registerLibyuvPeers()
                    [](const uint8_t* in, int step, uint8_t* o, Size s) {
                        libyuv::ARGBToYUY2(in, step, o, s.width * 2, s.width, s.height);
                    });
+    }
+    for (Size size : kSizes) {
+        const std::size_t luma = static_cast<std::size_t>(size.width) * size.height;
+        const std::size_t q = static_cast<std::size_t>(size.width / 2) * (size.height / 2), half = luma / 2;
+        // From 4:2:0 planes, Y and pairs, 4:2:2 planes and YUY2 groups.
+        unsamplePeer("libyuv I420ToRGB24", {"zoxiYCbCr420ToRGB_8u_P3C3R", "zoxiYUV420ToRGB_8u_P3C3R"}, size, luma + 2 * q, 3 * luma,
+                     [](const uint8_t* in, uint8_t* o, Size s) {
+                         const int w = s.width, h = s.height;
+                         libyuv::I420ToRGB24(in, w, in + w * h, w / 2, in + w * h + w / 2 * (h / 2), w / 2, o, 3 * w, w, h);
+                     });
+        unsamplePeer("libyuv NV12ToARGB", {"zoxiYCbCr420ToBGR_8u_P2C4R"}, size, luma + 2 * q, 4 * luma,
+                     [](const uint8_t* in, uint8_t* o, Size s) {
+                         const int w = s.width, h = s.height;
+                         libyuv::NV12ToARGB(in, w, in + w * h, w, o, 4 * w, w, h);
+                     });
+        unsamplePeer("libyuv I422ToRGB24", {"zoxiYCbCr422ToRGB_8u_P3C3R"}, size, luma + 2 * half, 3 * luma,
+                     [](const uint8_t* in, uint8_t* o, Size s) {
+                         const int w = s.width, h = s.height;
+                         libyuv::I422ToRGB24(in, w, in + w * h, w / 2, in + w * h + w / 2 * h, w / 2, o, 3 * w, w, h);
+                     });
+        unsamplePeer("libyuv YUY2ToARGB", {"zoxiYCbCr422ToRGB_8u_C2C3R"}, size, 2 * luma, 4 * luma,
+                     [](const uint8_t* in, uint8_t* o, Size s) { libyuv::YUY2ToARGB(in, 2 * s.width, o, 4 * s.width, s.width, s.height); });
     }
     for (Size size : kSizes) {
         const std::size_t px = static_cast<std::size_t>(size.width) * size.height;

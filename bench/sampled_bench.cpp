@@ -2,6 +2,7 @@
 // plus the luma and the sampled chroma written.
 #include "bench.hpp"
 #include "frame/exports.hpp"
+#include "frame/fromsampled.hpp"
 #include "frame/sampled.hpp"
 
 #include <type_traits>
@@ -81,6 +82,82 @@ void registerSampled(const char* name, F f)
     }
 }
 
+// A sampled source with its planes at their sizes, and a full-resolution destination.
+template <class Src>
+struct SampledSourceImage {
+    std::vector<uint8_t> bytes[3];
+    const uint8_t* ptr[3] = {};
+    int step[3] = {};
+    std::size_t read = 0;
+    explicit SampledSourceImage(Size s)
+    {
+        constexpr Sampling S = Src::sampling;
+        const int rows = S == Sampling::S420 ? s.height / 2 : s.height;
+        const int units = s.width / unitWidth(S);
+        const int widths[3] = {Src::planes == 1 ? 2 * s.width : s.width, Src::planes == 2 ? 2 * units : units, units};
+        for (int p = 0; p < Src::planes; ++p) {
+            const int r = p == 0 && Src::planes > 1 ? s.height : rows;
+            bytes[p] = randomBytes(static_cast<std::size_t>(widths[p]) * r, 3 + p);
+            ptr[p] = bytes[p].data();
+            step[p] = widths[p];
+            read += bytes[p].size();
+        }
+    }
+};
+
+template <class Dst>
+struct PixelImage {
+    std::vector<uint8_t> bytes[3];
+    uint8_t* ptr[3] = {};
+    int step;
+    explicit PixelImage(Size s) : step(s.width * Dst::bytesPerPixel)
+    {
+        for (int p = 0; p < Dst::planes; ++p) {
+            bytes[p].assign(static_cast<std::size_t>(step) * s.height, 0);
+            ptr[p] = bytes[p].data();
+        }
+    }
+    typename Dst::Arg arg()
+    {
+        if constexpr (Dst::planes == 1)
+            return ptr[0];
+        else
+            return ptr;
+    }
+};
+
+template <class Row, class F>
+void registerFromSampled(const char* name, F f)
+{
+    using Src = typename Row::Other::Src;
+    using Dst = typename Row::Other::Dst;
+    for (Size size : kSizes) {
+        const std::size_t bytes = SampledSourceImage<Src>(size).read + static_cast<std::size_t>(size.width) * size.height * Dst::planes * Dst::bytesPerPixel;
+        registerCase(name, size, bytes, [f](Size s) -> Call {
+            auto src = std::make_shared<SampledSourceImage<Src>>(s);
+            auto dst = std::make_shared<PixelImage<Dst>>(s);
+            const ImageSize roi{s.width, s.height};
+            return [f, src, dst, roi] {
+                using D = typename Dst::Arg;
+                if constexpr (std::is_invocable_v<F, const uint8_t* const*, const int*, D, int, ImageSize>)
+                    f(src->ptr, src->step, dst->arg(), dst->step, roi);
+                else if constexpr (std::is_invocable_v<F, const uint8_t* const*, const int*, D, int, ImageSize, uint8_t>)
+                    f(src->ptr, src->step, dst->arg(), dst->step, roi, uint8_t{255});
+                else if constexpr (std::is_invocable_v<F, const uint8_t*, int, const uint8_t*, int, D, int, ImageSize>)
+                    f(src->ptr[0], src->step[0], src->ptr[1], src->step[1], dst->arg(), dst->step, roi);
+                else if constexpr (std::is_invocable_v<F, const uint8_t*, int, const uint8_t*, int, D, int, ImageSize, uint8_t>)
+                    f(src->ptr[0], src->step[0], src->ptr[1], src->step[1], dst->arg(), dst->step, roi, uint8_t{255});
+                else if constexpr (std::is_invocable_v<F, const uint8_t*, int, D, int, ImageSize>)
+                    f(src->ptr[0], src->step[0], dst->arg(), dst->step, roi);
+                else if constexpr (std::is_invocable_v<F, const uint8_t*, int, D, int, ImageSize, uint8_t>)
+                    f(src->ptr[0], src->step[0], dst->arg(), dst->step, roi, uint8_t{255});
+                else
+                    f(src->ptr, dst->arg(), roi);
+            };
+        });
+    }
+}
+
 } // namespace
 
 void registerSampledFamilies()
@@ -89,6 +166,10 @@ void registerSampledFamilies()
     registerSampled<SampledRow<Src, Dst, Lim, Block, Rem, Tail>>(#name, &name);
     ZOX_TO_SAMPLED_TABLE(ZB_SAMPLED)
 #undef ZB_SAMPLED
+#define ZB_FROM_SAMPLED(name, shape, Src, Dst, Lim, Block, Rem, Last, Rules) \
+    registerFromSampled<FromSampledRow<Src, Dst, Lim, Block, Rem, Last>>(#name, &name);
+    ZOX_FROM_SAMPLED_TABLE(ZB_FROM_SAMPLED)
+#undef ZB_FROM_SAMPLED
 }
 
 } // namespace zb

@@ -226,6 +226,24 @@ void sampledDemo(Demo& d)
     d.time("zoxiBGRToYCbCr411_8u_AC4P3R", n * 4 + n * 3 / 2,
            [&] { return zoxiBGRToYCbCr411_8u_AC4P3R(bgra.data(), bgra.step(), q, steps411, roi); });
     d.write("ycbcr411-cb.pgm", u411);
+
+    // And back: each sampled image to RGB again, its chroma shared by the pixels of a unit.
+    Image back420(in.width, in.height, 3), back422(in.width, in.height, 3), back411(in.width, in.height, 4);
+    const uint8_t* c420[3] = {p[0], p[1], p[2]};
+    d.time("zoxiYCbCr420ToRGB_8u_P3C3R", n * 3 + n * 3 / 2,
+           [&] { return zoxiYCbCr420ToRGB_8u_P3C3R(c420, steps, back420.data(), back420.step(), roi); });
+    d.write("ycbcr420-roundtrip.ppm", back420);
+    d.time("zoxiYCbCr422ToRGB_8u_C2C3R", n * 5,
+           [&] { return zoxiYCbCr422ToRGB_8u_C2C3R(packed.data(), packed.step(), back422.data(), back422.step(), roi); });
+    d.write("ycbcr422-roundtrip.ppm", back422);
+    const uint8_t* c411[3] = {q[0], q[1], q[2]};
+    d.time("zoxiYCbCr411ToBGR_8u_P3C4R", n * 4 + n * 3 / 2,
+           [&] { return zoxiYCbCr411ToBGR_8u_P3C4R(c411, steps411, back411.data(), back411.step(), roi, 255); });
+    Image rgb411(in.width, in.height, 3);
+    for (std::size_t i = 0; i < n; ++i)
+        for (int k = 0; k < 3; ++k)
+            rgb411.pixels[3 * i + k] = back411.pixels[4 * i + 2 - k];
+    d.write("ycbcr411-roundtrip.ppm", rgb411);
 }
 
 } // namespace
@@ -239,7 +257,7 @@ const std::vector<FamilyDemo>& familyDemos()
         {"Gamma", gammaDemo},
         {"RGB <-> YCoCg", ycocgDemo},
         {"Tone mapping", toneMapDemo},
-        {"RGB to 4:2:0, 4:2:2 and 4:1:1", sampledDemo},
+        {"RGB to 4:2:0, 4:2:2 and 4:1:1 and back", sampledDemo},
     };
     return demos;
 }
