@@ -193,7 +193,6 @@ struct GroupIo<OutPacked<Bpp, O, F>> {
     // Each channel packed once to sixteen bytes a lane, then interleaved.
     static void put(const typename OutPacked<Bpp, O, F>::Row& row, int x, const V3& a, const V3& b, const Ctx& ctx)
     {
-        constexpr std::size_t g = 16 * Bpp;
         uint8_t* q = row.p[0] + static_cast<std::size_t>(x) * Bpp;
         V ch[3];
         #pragma GCC unroll 3
@@ -204,17 +203,14 @@ struct GroupIo<OutPacked<Bpp, O, F>> {
                 return or_(or_(shuffle(ch[0], maskOf(kScatter<3, Base, 0, 0>)), shuffle(ch[1], maskOf(kScatter<3, Base, 1, 0>))),
                            shuffle(ch[2], maskOf(kScatter<3, Base, 2, 0>)));
             };
-            storeLanes(q, g, part.template operator()<0>());
-            storeLanes(q + 16, g, part.template operator()<16>());
-            storeLanes(q + 32, g, part.template operator()<32>());
+            const V parts[3] = {part.template operator()<0>(), part.template operator()<16>(), part.template operator()<32>()};
+            storeAdjacent(q, parts);
         } else {
             const V c3 = packUs(fourthOf(a, ctx), fourthOf(b, ctx));
             const V lo01 = unpackLo8(ch[0], ch[1]), hi01 = unpackHi8(ch[0], ch[1]);
             const V lo23 = unpackLo8(ch[2], c3), hi23 = unpackHi8(ch[2], c3);
-            storeLanes(q, g, unpackLo16(lo01, lo23));
-            storeLanes(q + 16, g, unpackHi16(lo01, lo23));
-            storeLanes(q + 32, g, unpackLo16(hi01, hi23));
-            storeLanes(q + 48, g, unpackHi16(hi01, hi23));
+            const V parts[4] = {unpackLo16(lo01, lo23), unpackHi16(lo01, lo23), unpackLo16(hi01, hi23), unpackHi16(hi01, hi23)};
+            storeAdjacent(q, parts);
         }
     }
 };

@@ -66,6 +66,15 @@ inline V unpackHi16(V a, V b) { return _mm_unpackhi_epi16(a, b); }
 inline V unpackLo32(V a, V b) { return _mm_unpacklo_epi32(a, b); }
 inline V unpackHi32(V a, V b) { return _mm_unpackhi_epi32(a, b); }
 inline V loadLanes(const uint8_t* q, std::size_t) { return load16(q); }
+// N parts of a run of groups that lie one after another: part i holds bytes 16i..16i+15 of each lane's
+// group, the next group 16N bytes on.
+template <int N>
+inline void storeAdjacent(uint8_t* q, const V (&p)[N])
+{
+    #pragma GCC unroll 4
+    for (int i = 0; i < N; ++i)
+        store16(q + 16 * i, p[i]);
+}
 inline void storeLanes(uint8_t* q, std::size_t, V v) { store16(q, v); }
 
 // 32-bit lanes, for the whole-row forms whose products need more than 16 bits: four lanes.

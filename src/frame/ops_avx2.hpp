@@ -73,6 +73,25 @@ inline void storeLanes(uint8_t* q, std::size_t g, V v)
         _mm256_storeu2_m128i(reinterpret_cast<__m128i*>(q + g), reinterpret_cast<__m128i*>(q), v);
 }
 
+// N parts of a run of groups that lie one after another (part i: bytes 16i..16i+15 of each lane's group,
+// the upper lane's group 16N bytes on): the halves rejoined in address order into whole 256-bit stores.
+template <int N>
+inline void storeAdjacent(uint8_t* q, const V (&p)[N])
+{
+    auto put = [q](int at, V v) { _mm256_storeu_si256(reinterpret_cast<V*>(q + at), v); };
+    if constexpr (N == 3) {
+        put(0, _mm256_permute2x128_si256(p[0], p[1], 0x20));
+        put(32, _mm256_permute2x128_si256(p[2], p[0], 0x30));
+        put(64, _mm256_permute2x128_si256(p[1], p[2], 0x31));
+    } else {
+        static_assert(N == 4);
+        put(0, _mm256_permute2x128_si256(p[0], p[1], 0x20));
+        put(32, _mm256_permute2x128_si256(p[2], p[3], 0x20));
+        put(64, _mm256_permute2x128_si256(p[0], p[1], 0x31));
+        put(96, _mm256_permute2x128_si256(p[2], p[3], 0x31));
+    }
+}
+
 // 32-bit lanes, for the whole-row forms whose products need more than 16 bits: eight lanes.
 inline constexpr int kWideLanes = 8;
 template <int K>
