@@ -195,7 +195,7 @@ void convertPixelPass(const SampledRows& s, const PixelRows<typename C::Dst>& d,
     scalarPixelUnits<C, typename C::Block>(s, d, kernelPixelUnits<C, K>(s, d, 0, nb, false, ctx), nb, ctx);
     scalarPixelUnits<C, typename C::Rem>(s, d, kernelPixelUnits<C, K>(s, d, nb, units, true, ctx), units, ctx);
     if constexpr (C::sampling == Sampling::S411) { // the last whole unit's chroma, the form by the limit
-        for (int x = units * 4; x < width; ++x) {
+        for (int x = units * 4; units > 0 && x < width; ++x) {
             const ChromaPair ch = C::Src::chroma(s, units - 1);
             if (x < limit)
                 storePixel<C, typename C::Block>(s, d, 0, x, ch, ctx);
