@@ -285,6 +285,74 @@ ZOXCC_API zoxStatus zoxiYUV422ToRGB_8u_P3AC4R(const uint8_t* const src[3], const
 ZOXCC_API zoxStatus zoxiYCbCr411ToBGR_8u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
 ZOXCC_API zoxStatus zoxiYCbCr411ToBGR_8u_P3C4R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
 
+/* ---- Repacking of chroma-sampled images, 8u: among 4:2:2, 4:2:0, 4:1:1, groups, pairs and planes -------
+ * No arithmetic: every output sample is a copy of one input sample. Chroma is thinned by dropping
+ * (4:2:2 to 4:2:0: the even rows; 4:2:2 to 4:1:1: the even samples) and widened by repeating (4:2:0 to
+ * 4:2:2: each row twice; 4:1:1 to 4:2:2: each sample twice). 4:1:1 to 4:2:0 folds two chroma rows into
+ * one (samples alternate between them), 4:2:0 to 4:1:1 unfolds one row into two: exact inverses.
+ * Layouts: C2 4 bytes for 2 pixels (YCbCr422 Y0 Cb Y1 Cr, YCrCb422 Y0 Cr Y1 Cb, CbYCr422 Cb Y0 Cr Y1);
+ * P3 planes Y, Cb, Cr (YCrCb names: Y, Cr, Cb); P2 Y and Cb,Cr pairs. Chroma planes: 4:2:2 width/2 x
+ * height, 4:2:0 width/2 x height/2, 4:1:1 width/4 x height.
+ * Region in use: width rounded down to 4 with 4:1:1 on either side (else to 2), height rounded down to 2
+ * with 4:2:0 on either side; nothing beyond it is read or written, and no warning is given.
+ * zoxiYCbCr420ToYCrCb420_8u_P2P3R writes each pair's first byte to the second plane, like
+ * zoxiYCbCr420_8u_P2P3R.
+ * Checks: every pointer (array elements included), then the sizes: 2x2 for members with 4:2:0 (4x2 with
+ * 4:1:1 on the other side), 2x1 for 4:2:2 copies, width 4 for the 4:1:1 ones with 4:2:2 or 4:1:1 (height
+ * not examined: 0 or below converts nothing) but YCbCr422ToYCbCr411_8u_C2P3R (4x1), width 2 for
+ * YCbCr422ToYCrCb422 (height not examined); YCbCr420ToYCrCb420_8u_P2P3R: srcY, srcCbCr, dst, then a size
+ * below 1, then the planes, then 2x2. Steps are not examined. */
+ZOXCC_API zoxStatus zoxiCbYCr422ToYCbCr411_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiCbYCr422ToYCbCr420_8u_C2P2R(const uint8_t* src, int srcStep, uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiCbYCr422ToYCbCr420_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiCbYCr422ToYCbCr422_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiCbYCr422ToYCbCr422_8u_C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiCbYCr422ToYCrCb420_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToYCbCr420_8u_P2P3R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToYCbCr420_8u_P3P2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToYCbCr420_8u_P3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToYCrCb420_8u_P2P3R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToYCbCr422_8u_P2C2R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToYCbCr422_8u_P2P3R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToYCbCr422_8u_P3C2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToYCbCr422_8u_P3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToYCrCb422_8u_P3C2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToYCrCb422_8u_P3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411_8u_P2P3R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411_8u_P3P2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToCbYCr422_8u_P2C2R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToYCbCr411_8u_P2P3R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToYCbCr411_8u_P3P2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb420ToYCbCr411_8u_P3P2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToYCbCr422_8u_P2C2R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToYCbCr422_8u_P2P3R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToYCbCr422_8u_P3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToYCrCb420_8u_P2P3R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420_8u_P2P3R(const uint8_t* srcY, int srcYStep, const uint8_t* srcCbCr, int srcCbCrStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420_8u_P3P2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToCbYCr422_8u_C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToCbYCr422_8u_P3C2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToYCbCr411_8u_C2P2R(const uint8_t* src, int srcStep, uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToYCbCr411_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToYCbCr411_8u_P3P2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToYCbCr411_8u_P3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToYCbCr420_8u_C2P2R(const uint8_t* src, int srcStep, uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToYCbCr420_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToYCbCr420_8u_P3P2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToYCbCr420_8u_P3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToYCrCb420_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToYCrCb422_8u_C2R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToYCrCb422_8u_P3C2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422_8u_P3C2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb420ToCbYCr422_8u_P3C2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb420ToYCbCr420_8u_P3P2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dstY, int dstYStep, uint8_t* dstCbCr, int dstCbCrStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb420ToYCbCr422_8u_P3C2R(const uint8_t* const src[3], const int srcStep[3], uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb420ToYCbCr422_8u_P3R(const uint8_t* const src[3], const int srcStep[3], uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb422ToYCbCr411_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb422ToYCbCr420_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCrCb422ToYCbCr422_8u_C2P3R(const uint8_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+
 /* ---- Gamma correction, 8u / 16u / 32f ----------------------------------------------------------------
  * The BT.709 transfer curve, forward (linear to encoded) or inverse, on every colour sample. 8u reads a
  * constant table; 16u evaluates the curve in double precision per sample, or through a 65536-entry table

@@ -6,6 +6,7 @@
 #include "lumachroma/yuv_table.hpp"
 #include "pointops/gamma_table.hpp"
 #include "sampling/fromsampled_table.hpp"
+#include "sampling/repack_table.hpp"
 #include "sampling/tosampled_table.hpp"
 #include "tonemap/tonemap_table.hpp"
 #include "ycocg/ycocg_table.hpp"
@@ -14,4 +15,4 @@
 #define ZOX_CONV_TABLES(X) ZOX_YUV_TABLE(X) ZOX_YCBCR_TABLE(X) ZOX_YCOCG_TABLE(X) ZOX_XYZYCC_TABLE(X)
 
 // Apply X to every export row of every family (the first argument of each row is the export name).
-#define ZOX_ALL_EXPORTS(X) ZOX_CONV_TABLES(X) ZOX_GAMMA_TABLE(X) ZOX_TONEMAP_TABLE(X) ZOX_TO_SAMPLED_TABLE(X) ZOX_FROM_SAMPLED_TABLE(X)
+#define ZOX_ALL_EXPORTS(X) ZOX_CONV_TABLES(X) ZOX_GAMMA_TABLE(X) ZOX_TONEMAP_TABLE(X) ZOX_TO_SAMPLED_TABLE(X) ZOX_FROM_SAMPLED_TABLE(X) ZOX_REPACK_TABLE(X)
