@@ -97,6 +97,32 @@ void registerLibyuvPeers()
                          const int w = s.width, h = s.height;
                          libyuv::I422ToRGB24(in, w, in + w * h, w / 2, in + w * h + w / 2 * h, w / 2, o, 3 * w, w, h);
                      });
+        // Repacking.
+        unsamplePeer("libyuv NV12ToI420", {"zoxiYCbCr420_8u_P2P3R"}, size, luma + 2 * q, luma + 2 * q,
+                     [](const uint8_t* in, uint8_t* o, Size s) {
+                         const int w = s.width, h = s.height;
+                         libyuv::NV12ToI420(in, w, in + w * h, w, o, w, o + w * h, w / 2, o + w * h + w / 2 * (h / 2), w / 2, w, h);
+                     });
+        unsamplePeer("libyuv I420ToNV12", {"zoxiYCbCr420_8u_P3P2R"}, size, luma + 2 * q, luma + 2 * q,
+                     [](const uint8_t* in, uint8_t* o, Size s) {
+                         const int w = s.width, h = s.height;
+                         libyuv::I420ToNV12(in, w, in + w * h, w / 2, in + w * h + w / 2 * (h / 2), w / 2, o, w, o + w * h, w, w, h);
+                     });
+        unsamplePeer("libyuv YUY2ToI420", {"zoxiYCbCr422ToYCbCr420_8u_C2P3R"}, size, 2 * luma, luma + 2 * q,
+                     [](const uint8_t* in, uint8_t* o, Size s) {
+                         const int w = s.width, h = s.height;
+                         libyuv::YUY2ToI420(in, 2 * w, o, w, o + w * h, w / 2, o + w * h + w / 2 * (h / 2), w / 2, w, h);
+                     });
+        unsamplePeer("libyuv I422ToYUY2", {"zoxiYCbCr422_8u_P3C2R"}, size, luma + 2 * half, 2 * luma,
+                     [](const uint8_t* in, uint8_t* o, Size s) {
+                         const int w = s.width, h = s.height;
+                         libyuv::I422ToYUY2(in, w, in + w * h, w / 2, in + w * h + w / 2 * h, w / 2, o, 2 * w, w, h);
+                     });
+        unsamplePeer("libyuv I420ToUYVY", {"zoxiYCrCb420ToCbYCr422_8u_P3C2R"}, size, luma + 2 * q, 2 * luma,
+                     [](const uint8_t* in, uint8_t* o, Size s) {
+                         const int w = s.width, h = s.height;
+                         libyuv::I420ToUYVY(in, w, in + w * h, w / 2, in + w * h + w / 2 * (h / 2), w / 2, o, 2 * w, w, h);
+                     });
         unsamplePeer("libyuv YUY2ToARGB", {"zoxiYCbCr422ToRGB_8u_C2C3R"}, size, 2 * luma, 4 * luma,
                      [](const uint8_t* in, uint8_t* o, Size s) { libyuv::YUY2ToARGB(in, 2 * s.width, o, 4 * s.width, s.width, s.height); });
     }

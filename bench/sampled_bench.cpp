@@ -4,6 +4,7 @@
 #include "frame/exports.hpp"
 #include "frame/fromsampled.hpp"
 #include "frame/sampled.hpp"
+#include "sampling/repack.hpp"
 
 #include <type_traits>
 
@@ -158,6 +159,60 @@ void registerFromSampled(const char* name, F f)
     }
 }
 
+// One side of a repacking call at its format's sizes; bytes it holds.
+template <class F>
+struct RepackImageSide {
+    std::vector<uint8_t> bytes[3];
+    uint8_t* ptr[3] = {};
+    int step[3] = {};
+    std::size_t size = 0;
+    explicit RepackImageSide(Size s)
+    {
+        const int rows = F::sampling == Sampling::S420 ? s.height / 2 : s.height;
+        const int cw = F::sampling == Sampling::S411 ? s.width / 4 : s.width / 2;
+        const int widths[3] = {F::planes == 1 ? 2 * s.width : s.width, F::planes == 2 ? 2 * cw : cw, cw};
+        for (int p = 0; p < F::planes; ++p) {
+            const int r = p == 0 ? s.height : rows;
+            bytes[p] = randomBytes(static_cast<std::size_t>(widths[p]) * r, 7 + p);
+            ptr[p] = bytes[p].data();
+            step[p] = widths[p];
+            size += bytes[p].size();
+        }
+    }
+};
+
+template <class C, class F>
+void registerRepack(const char* name, F f)
+{
+    using S = typename C::Src;
+    using D = typename C::Dst;
+    for (Size size : kSizes) {
+        const std::size_t bytes = RepackImageSide<S>(size).size + RepackImageSide<D>(size).size;
+        registerCase(name, size, bytes, [f](Size sz) -> Call {
+            auto s = std::make_shared<RepackImageSide<S>>(sz);
+            auto d = std::make_shared<RepackImageSide<D>>(sz);
+            const ImageSize roi{sz.width, sz.height};
+            return [f, s, d, roi] {
+                auto withDst = [&](auto... a) {
+                    if constexpr (D::planes == 3)
+                        f(a..., d->ptr, d->step, roi);
+                    else if constexpr (D::planes == 2)
+                        f(a..., d->ptr[0], d->step[0], d->ptr[1], d->step[1], roi);
+                    else
+                        f(a..., d->ptr[0], d->step[0], roi);
+                };
+                const uint8_t* const sp[3] = {s->ptr[0], s->ptr[1], s->ptr[2]};
+                if constexpr (S::planes == 3)
+                    withDst(sp, s->step);
+                else if constexpr (S::planes == 2)
+                    withDst(sp[0], s->step[0], sp[1], s->step[1]);
+                else
+                    withDst(sp[0], s->step[0]);
+            };
+        });
+    }
+}
+
 } // namespace
 
 void registerSampledFamilies()
@@ -170,6 +225,9 @@ void registerSampledFamilies()
     registerFromSampled<FromSampledRow<Src, Dst, Lim, Block, Rem, Last>>(#name, &name);
     ZOX_FROM_SAMPLED_TABLE(ZB_FROM_SAMPLED)
 #undef ZB_FROM_SAMPLED
+#define ZB_REPACK(name, shape, Src, Dst, Rule, Class, Stream) registerRepack<ZOX_REPACK(Src, Dst, Rule, Class, Stream)>(#name, &name);
+    ZOX_REPACK_TABLE(ZB_REPACK)
+#undef ZB_REPACK
 }
 
 } // namespace zb

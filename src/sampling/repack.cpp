@@ -4,6 +4,7 @@
 namespace zox::portable {
 #include "sampling/repack_moves.inl"
 ZOX_REPACK_MOVES
+ZOX_REPACK_BUILDERS
 } // namespace zox::portable
 
 using namespace zox;

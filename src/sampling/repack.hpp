@@ -26,14 +26,32 @@ enum class SampleMap { Same, Drop, Repeat }; // i, 2i, i / 2
 namespace portable {
 template <int SS, int DS, SampleMap M>
 void moveSamples(const uint8_t* s, uint8_t* d, int n);
+template <int SY, int SC, SampleMap M, int Y0, int CB, int CR>
+void buildGroups(const uint8_t* y, const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
+template <int SC, SampleMap M>
+void buildPairs(const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
+template <int SC>
+void buildQuads(const uint8_t* a, const uint8_t* b, const uint8_t* c, const uint8_t* e, uint8_t* d, int n);
 }
 namespace sse41 {
 template <int SS, int DS, SampleMap M>
 void moveSamples(const uint8_t* s, uint8_t* d, int n);
+template <int SY, int SC, SampleMap M, int Y0, int CB, int CR>
+void buildGroups(const uint8_t* y, const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
+template <int SC, SampleMap M>
+void buildPairs(const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
+template <int SC>
+void buildQuads(const uint8_t* a, const uint8_t* b, const uint8_t* c, const uint8_t* e, uint8_t* d, int n);
 }
 namespace avx2 {
 template <int SS, int DS, SampleMap M>
 void moveSamples(const uint8_t* s, uint8_t* d, int n);
+template <int SY, int SC, SampleMap M, int Y0, int CB, int CR>
+void buildGroups(const uint8_t* y, const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
+template <int SC, SampleMap M>
+void buildPairs(const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
+template <int SC>
+void buildQuads(const uint8_t* a, const uint8_t* b, const uint8_t* c, const uint8_t* e, uint8_t* d, int n);
 }
 
 template <KernelSet K, int SS, int DS, SampleMap M>
@@ -47,6 +65,45 @@ inline void moveRun(const uint8_t* s, uint8_t* d, int n)
         sse41::moveSamples<SS, DS, M>(s, d, n);
     else
         portable::moveSamples<SS, DS, M>(s, d, n);
+}
+
+// A row of 4:2:2 groups (order G) from luma and chroma runs, and a row of pairs from two chroma runs.
+template <KernelSet K, int SY, int SC, SampleMap M, const GroupOrder& G>
+inline void groupsRun(const uint8_t* y, const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n)
+{
+    if (n <= 0)
+        return;
+    if constexpr (K == KernelSet::Avx2)
+        avx2::buildGroups<SY, SC, M, G.y0, G.cb, G.cr>(y, cb, cr, d, n);
+    else if constexpr (K == KernelSet::Sse41)
+        sse41::buildGroups<SY, SC, M, G.y0, G.cb, G.cr>(y, cb, cr, d, n);
+    else
+        portable::buildGroups<SY, SC, M, G.y0, G.cb, G.cr>(y, cb, cr, d, n);
+}
+template <KernelSet K, int SC, SampleMap M>
+inline void pairsRun(const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n)
+{
+    if (n <= 0)
+        return;
+    if constexpr (K == KernelSet::Avx2)
+        avx2::buildPairs<SC, M>(cb, cr, d, n);
+    else if constexpr (K == KernelSet::Sse41)
+        sse41::buildPairs<SC, M>(cb, cr, d, n);
+    else
+        portable::buildPairs<SC, M>(cb, cr, d, n);
+}
+
+template <KernelSet K, int SC>
+inline void quadsRun(const uint8_t* a, const uint8_t* b, const uint8_t* c, const uint8_t* e, uint8_t* d, int n)
+{
+    if (n <= 0)
+        return;
+    if constexpr (K == KernelSet::Avx2)
+        avx2::buildQuads<SC>(a, b, c, e, d, n);
+    else if constexpr (K == KernelSet::Sse41)
+        sse41::buildQuads<SC>(a, b, c, e, d, n);
+    else
+        portable::buildQuads<SC>(a, b, c, e, d, n);
 }
 
 // The planes of one side of a call in Y, Cb, Cr order (Y and pairs: two; groups: one).
@@ -80,6 +137,7 @@ template <const GroupOrder& G>
 struct FmtGroups {
     static constexpr Sampling sampling = Sampling::S422;
     static constexpr int planes = 1, lumaStride = 2, lumaOffset = G.y0, chromaStride = 4;
+    static constexpr const GroupOrder& order = G;
     static constexpr bool crFirst = false;
     static constexpr int chromaPlane(int) { return 0; }
     static constexpr int chromaOffset(int c) { return c == 0 ? G.cb : G.cr; }
@@ -128,6 +186,16 @@ void repackPass(const RepackSide<const uint8_t>& s, const RepackSide<uint8_t>& d
     using S = typename C::Src;
     using D = typename C::Dst;
     constexpr int SS = S::chromaStride, DS = D::chromaStride;
+    constexpr ChromaRule R0 = C::rule;
+    if constexpr (requires { D::order; }) { // groups: each row's luma and chroma in one pass
+        constexpr SampleMap M = R0 == ChromaRule::SampleRepeat ? SampleMap::Repeat : SampleMap::Same;
+        for (int k = 0; k < C::passRows; ++k) {
+            const int r = p * C::passRows + k, j = R0 == ChromaRule::RowRepeat ? p : r;
+            groupsRun<K, S::lumaStride, SS, M, D::order>(lumaRow<S>(s, r), chromaRow<S>(s, 0, j), chromaRow<S>(s, 1, j),
+                                                          rowAddress(d.plane[0], d.step[0], r), w / 2);
+        }
+        return;
+    }
     for (int k = 0; k < C::passRows; ++k) {
         const int r = p * C::passRows + k;
         if constexpr (S::lumaStride == 1 && D::lumaStride == 1)
@@ -144,6 +212,31 @@ void repackPass(const RepackSide<const uint8_t>& s, const RepackSide<uint8_t>& d
         else
             moveRun<K, SS, DS, SampleMap::Same>(from, to, dn);
     };
+    if constexpr (R == ChromaRule::RowFold) { // 4:1:1 rows 2p and 2p + 1 interleave, sample by sample
+        if constexpr (D::planes == 2)
+            quadsRun<K, SS>(chromaRow<S>(s, 0, 2 * p), chromaRow<S>(s, 1, 2 * p), chromaRow<S>(s, 0, 2 * p + 1),
+                            chromaRow<S>(s, 1, 2 * p + 1), rowAddress(d.plane[1], d.step[1], p), w / 4);
+        else
+            for (int c = 0; c < 2; ++c)
+                pairsRun<K, SS, SampleMap::Same>(chromaRow<S>(s, c, 2 * p), chromaRow<S>(s, c, 2 * p + 1), chromaRow<D>(d, c, p), w / 4);
+        return;
+    } else if constexpr (D::planes == 2) { // pairs: both components in one pass
+        auto pairs = [&]<SampleMap M>(int j, int at, int n, int offset) {
+            pairsRun<K, SS, M>(chromaRow<S>(s, 0, j) + offset, chromaRow<S>(s, 1, j) + offset, rowAddress(d.plane[1], d.step[1], at), n);
+        };
+        if constexpr (R == ChromaRule::Copy)
+            pairs.template operator()<SampleMap::Same>(p, p, dn, 0);
+        else if constexpr (R == ChromaRule::RowDrop)
+            pairs.template operator()<SampleMap::Same>(2 * p, p, dn, 0);
+        else if constexpr (R == ChromaRule::SampleDrop)
+            pairs.template operator()<SampleMap::Drop>(p, p, dn, 0);
+        else if constexpr (R == ChromaRule::RowUnfold) {
+            pairs.template operator()<SampleMap::Drop>(p, 2 * p, w / 4, 0);
+            pairs.template operator()<SampleMap::Drop>(p, 2 * p + 1, w / 4, SS);
+        } else
+            static_assert(R == ChromaRule::Copy, "no other rule ends in pairs");
+        return;
+    }
     for (int c = 0; c < 2; ++c) {
         auto from = [&](int j) { return chromaRow<S>(s, c, j); };
         auto to = [&](int j) { return chromaRow<D>(d, c, j); };
@@ -158,9 +251,6 @@ void repackPass(const RepackSide<const uint8_t>& s, const RepackSide<uint8_t>& d
             moveRun<K, SS, DS, SampleMap::Repeat>(from(p), to(p), dn);
         } else if constexpr (R == ChromaRule::SampleDrop) { // 4:2:2 to 4:1:1
             moveRun<K, SS, DS, SampleMap::Drop>(from(p), to(p), dn);
-        } else if constexpr (R == ChromaRule::RowFold) { // 4:1:1 rows 2p and 2p + 1 interleave into 4:2:0 row p
-            moveRun<K, SS, 2 * DS, SampleMap::Same>(from(2 * p), to(p), w / 4);
-            moveRun<K, SS, 2 * DS, SampleMap::Same>(from(2 * p + 1), to(p) + DS, w / 4);
         } else { // 4:2:0 row p splits into 4:1:1 rows 2p (its even samples) and 2p + 1 (its odd ones)
             moveRun<K, SS, DS, SampleMap::Drop>(from(p), to(2 * p), w / 4);
             moveRun<K, SS, DS, SampleMap::Drop>(from(p) + SS, to(2 * p + 1), w / 4);

@@ -4,4 +4,5 @@
 namespace zox::avx2 {
 #include "sampling/repack_moves.inl"
 ZOX_REPACK_MOVES
+ZOX_REPACK_BUILDERS
 } // namespace zox::avx2

@@ -4,4 +4,5 @@
 namespace zox::sse41 {
 #include "sampling/repack_moves.inl"
 ZOX_REPACK_MOVES
+ZOX_REPACK_BUILDERS
 } // namespace zox::sse41
