@@ -8,11 +8,14 @@ void moveSamples(const uint8_t* __restrict s, uint8_t* __restrict d, int n)
 {
     constexpr std::ptrdiff_t ss = SS, ds = DS;
     if constexpr (M == SampleMap::Repeat) { // each source sample to two neighbours
-        int i = 0;
-        for (; i + 1 < n; i += 2)
-            d[ds * i] = d[ds * (i + 1)] = s[ss * (i >> 1)];
-        if (i < n)
-            d[ds * i] = s[ss * (i >> 1)];
+        const int pairs = n / 2;
+        for (int k = 0; k < pairs; ++k) {
+            const uint8_t v = s[ss * k];
+            d[ds * 2 * k] = v;
+            d[ds * (2 * k + 1)] = v;
+        }
+        if (n & 1)
+            d[ds * (n - 1)] = s[ss * pairs];
     } else {
         for (int i = 0; i < n; ++i)
             d[ds * i] = s[ss * (M == SampleMap::Same ? i : 2 * i)];
@@ -38,13 +41,19 @@ void buildGroups(const uint8_t* __restrict y, const uint8_t* __restrict cb, cons
         g[CR] = cr[sc * at];
     };
     if constexpr (M == SampleMap::Repeat) { // two groups a chroma sample
-        int k = 0;
-        for (; k + 1 < n; k += 2) {
-            group(k, k >> 1);
-            group(k + 1, k >> 1);
+        const int pairs = n / 2;
+        for (int k = 0; k < pairs; ++k) {
+            const uint8_t b = cb[sc * k], r = cr[sc * k];
+            uint8_t* g = d + 8 * static_cast<std::ptrdiff_t>(k);
+            g[Y0] = y[sy * 4 * k];
+            g[Y0 + 2] = y[sy * (4 * k + 1)];
+            g[Y0 + 4] = y[sy * (4 * k + 2)];
+            g[Y0 + 6] = y[sy * (4 * k + 3)];
+            g[CB] = g[CB + 4] = b;
+            g[CR] = g[CR + 4] = r;
         }
-        if (k < n)
-            group(k, k >> 1);
+        if (n & 1)
+            group(n - 1, pairs);
     } else {
         for (int k = 0; k < n; ++k)
             group(k, k);
