@@ -246,6 +246,35 @@ void sampledDemo(Demo& d)
     d.write("ycbcr411-roundtrip.ppm", rgb411);
 }
 
+// Repacking: the 4:2:0 planes as 4:2:2 groups (each chroma row twice, the planes named Cr first), the
+// picture from those groups, and the 4:2:0 chroma unfolded into 4:1:1 pairs.
+void repackDemo(Demo& d)
+{
+    const Image& in = d.input();
+    const ImageSize roi{in.width, in.height};
+    const std::size_t n = pixels(in);
+    Image y(in.width, in.height, 1), cb(in.width / 2, in.height / 2, 1), cr(in.width / 2, in.height / 2, 1);
+    uint8_t* p[3] = {y.data(), cb.data(), cr.data()};
+    const int steps[3] = {in.width, in.width / 2, in.width / 2};
+    zoxiRGBToYCbCr420_8u_C3P3R(in.data(), in.step(), p, steps, roi);
+    const uint8_t* c[3] = {p[0], p[1], p[2]};
+    Image groups(in.width * 2, in.height, 1);
+    d.time("zoxiYCrCb420ToYCbCr422_8u_P3C2R", n * 3 / 2 + n * 2, [&] {
+        const uint8_t* crFirst[3] = {c[0], c[2], c[1]};
+        const int stepsCrFirst[3] = {steps[0], steps[2], steps[1]};
+        return zoxiYCrCb420ToYCbCr422_8u_P3C2R(crFirst, stepsCrFirst, groups.data(), groups.step(), roi);
+    });
+    d.write("repack-422-groups.pgm", groups);
+    Image back(in.width, in.height, 3);
+    zoxiYCbCr422ToRGB_8u_C2C3R(groups.data(), groups.step(), back.data(), back.step(), roi);
+    d.write("repack-422-rgb.ppm", back);
+    Image y411(in.width, in.height, 1), pairs411(in.width / 2, in.height, 1);
+    d.time("zoxiYCbCr420ToYCbCr411_8u_P3P2R", n * 3, [&] {
+        return zoxiYCbCr420ToYCbCr411_8u_P3P2R(c, steps, y411.data(), y411.step(), pairs411.data(), pairs411.step(), roi);
+    });
+    d.write("repack-411-pairs.pgm", pairs411);
+}
+
 } // namespace
 
 const std::vector<FamilyDemo>& familyDemos()
@@ -258,6 +287,7 @@ const std::vector<FamilyDemo>& familyDemos()
         {"RGB <-> YCoCg", ycocgDemo},
         {"Tone mapping", toneMapDemo},
         {"RGB to 4:2:0, 4:2:2 and 4:1:1 and back", sampledDemo},
+        {"Repacking among samplings and layouts", repackDemo},
     };
     return demos;
 }
