@@ -32,6 +32,8 @@ template <int SC, SampleMap M>
 void buildPairs(const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
 template <int SC>
 void buildQuads(const uint8_t* a, const uint8_t* b, const uint8_t* c, const uint8_t* e, uint8_t* d, int n);
+template <const GroupOrder& From, const GroupOrder& To>
+void reorderGroups(const uint8_t* s, uint8_t* d, int n);
 }
 namespace sse41 {
 template <int SS, int DS, SampleMap M>
@@ -42,6 +44,8 @@ template <int SC, SampleMap M>
 void buildPairs(const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
 template <int SC>
 void buildQuads(const uint8_t* a, const uint8_t* b, const uint8_t* c, const uint8_t* e, uint8_t* d, int n);
+template <const GroupOrder& From, const GroupOrder& To>
+void reorderGroups(const uint8_t* s, uint8_t* d, int n);
 }
 namespace avx2 {
 template <int SS, int DS, SampleMap M>
@@ -52,6 +56,8 @@ template <int SC, SampleMap M>
 void buildPairs(const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
 template <int SC>
 void buildQuads(const uint8_t* a, const uint8_t* b, const uint8_t* c, const uint8_t* e, uint8_t* d, int n);
+template <const GroupOrder& From, const GroupOrder& To>
+void reorderGroups(const uint8_t* s, uint8_t* d, int n);
 }
 
 template <KernelSet K, int SS, int DS, SampleMap M>
@@ -93,6 +99,18 @@ inline void pairsRun(const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n)
         portable::buildPairs<SC, M>(cb, cr, d, n);
 }
 
+template <KernelSet K, const GroupOrder& From, const GroupOrder& To>
+inline void reorderRun(const uint8_t* s, uint8_t* d, int n)
+{
+    if (n <= 0)
+        return;
+    if constexpr (K == KernelSet::Avx2)
+        avx2::reorderGroups<From, To>(s, d, n);
+    else if constexpr (K == KernelSet::Sse41)
+        sse41::reorderGroups<From, To>(s, d, n);
+    else
+        portable::reorderGroups<From, To>(s, d, n);
+}
 template <KernelSet K, int SC>
 inline void quadsRun(const uint8_t* a, const uint8_t* b, const uint8_t* c, const uint8_t* e, uint8_t* d, int n)
 {
@@ -189,6 +207,10 @@ void repackPass(const RepackSide<const uint8_t>& s, const RepackSide<uint8_t>& d
     constexpr ChromaRule R0 = C::rule;
     if constexpr (requires { D::order; }) { // groups: each row's luma and chroma in one pass
         constexpr SampleMap M = R0 == ChromaRule::SampleRepeat ? SampleMap::Repeat : SampleMap::Same;
+        if constexpr (requires { S::order; }) { // groups to groups: a byte order to another
+            reorderRun<K, S::order, D::order>(rowAddress(s.plane[0], s.step[0], p), rowAddress(d.plane[0], d.step[0], p), w / 2);
+            return;
+        }
         for (int k = 0; k < C::passRows; ++k) {
             const int r = p * C::passRows + k, j = R0 == ChromaRule::RowRepeat ? p : r;
             groupsRun<K, S::lumaStride, SS, M, D::order>(lumaRow<S>(s, r), chromaRow<S>(s, 0, j), chromaRow<S>(s, 1, j),

@@ -22,6 +22,33 @@ void moveSamples(const uint8_t* __restrict s, uint8_t* __restrict d, int n)
     }
 }
 
+// Groups to groups of another byte order: each destination byte takes its sample's byte of the same
+// group. A vector prefix (reorderGroupsFast) where the set has one.
+constexpr int groupSourceByte(const GroupOrder& from, const GroupOrder& to, int j)
+{
+    return j == to.y0 ? from.y0 : j == to.y1 ? from.y1 : j == to.cb ? from.cb : from.cr;
+}
+
+template <const GroupOrder& From, const GroupOrder& To>
+void reorderGroups(const uint8_t* __restrict s, uint8_t* __restrict d, int n)
+{
+    constexpr int b0 = groupSourceByte(From, To, 0), b1 = groupSourceByte(From, To, 1), b2 = groupSourceByte(From, To, 2),
+                  b3 = groupSourceByte(From, To, 3);
+    for (int k = reorderGroupsFast<From, To>(s, d, n); k < n; ++k) {
+        const uint8_t* g = s + 4 * static_cast<std::ptrdiff_t>(k);
+        uint8_t* o = d + 4 * static_cast<std::ptrdiff_t>(k);
+        o[0] = g[b0];
+        o[1] = g[b1];
+        o[2] = g[b2];
+        o[3] = g[b3];
+    }
+}
+
+#define ZOX_REPACK_REORDERS                                                                       \
+    template void reorderGroups<CbYCrY, YCbYCr>(const uint8_t*, uint8_t*, int);                  \
+    template void reorderGroups<YCbYCr, CbYCrY>(const uint8_t*, uint8_t*, int);                  \
+    template void reorderGroups<YCbYCr, YCrYCb>(const uint8_t*, uint8_t*, int);
+
 #define ZOX_REPACK_MOVE(SS, DS, M) template void moveSamples<SS, DS, SampleMap::M>(const uint8_t*, uint8_t*, int);
 #define ZOX_REPACK_MOVES_DS(SS, DS) ZOX_REPACK_MOVE(SS, DS, Same) ZOX_REPACK_MOVE(SS, DS, Drop) ZOX_REPACK_MOVE(SS, DS, Repeat)
 #define ZOX_REPACK_MOVES_SS(SS) ZOX_REPACK_MOVES_DS(SS, 1) ZOX_REPACK_MOVES_DS(SS, 2) ZOX_REPACK_MOVES_DS(SS, 4) ZOX_REPACK_MOVES_DS(SS, 8)
@@ -98,4 +125,4 @@ void buildPairs(const uint8_t* __restrict cb, const uint8_t* __restrict cr, uint
     template void buildPairs<SC, SampleMap::Drop>(const uint8_t*, const uint8_t*, uint8_t*, int);                    \
     template void buildPairs<SC, SampleMap::Repeat>(const uint8_t*, const uint8_t*, uint8_t*, int);
 #define ZOX_REPACK_QUADS(SC) template void buildQuads<SC>(const uint8_t*, const uint8_t*, const uint8_t*, const uint8_t*, uint8_t*, int);
-#define ZOX_REPACK_BUILDERS ZOX_REPACK_QUADS(1) ZOX_REPACK_QUADS(2) ZOX_REPACK_GROUPS_SY(1) ZOX_REPACK_GROUPS_SY(2) ZOX_REPACK_PAIRS(1) ZOX_REPACK_PAIRS(2) ZOX_REPACK_PAIRS(4)
+#define ZOX_REPACK_BUILDERS ZOX_REPACK_REORDERS ZOX_REPACK_QUADS(1) ZOX_REPACK_QUADS(2) ZOX_REPACK_GROUPS_SY(1) ZOX_REPACK_GROUPS_SY(2) ZOX_REPACK_PAIRS(1) ZOX_REPACK_PAIRS(2) ZOX_REPACK_PAIRS(4)
