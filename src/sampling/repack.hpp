@@ -21,43 +21,28 @@ namespace zox {
 // Where sample i of a destination run comes from in its source run.
 enum class SampleMap { Same, Drop, Repeat }; // i, 2i, i / 2
 
-// The one loop of the family in each kernel set; explicitly instantiated for source strides 1, 2, 4 and
-// destination strides 1, 2, 4, 8.
+// The loops of the family, declared alike in each kernel set's namespace and explicitly instantiated in
+// its files (repack_moves.inl): single runs for source strides 1, 2, 4 and destination strides 1, 2, 4,
+// 8; rows of groups, pairs, quads; groups reordered.
+#define ZOX_REPACK_LOOPS                                                                                            \
+    template <int SS, int DS, SampleMap M>                                                                          \
+    void moveSamples(const uint8_t* s, uint8_t* d, int n);                                                          \
+    template <int SY, int SC, SampleMap M, int Y0, int CB, int CR>                                                  \
+    void buildGroups(const uint8_t* y, const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);                    \
+    template <int SC, SampleMap M>                                                                                  \
+    void buildPairs(const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);                                       \
+    template <int SC>                                                                                               \
+    void buildQuads(const uint8_t* a, const uint8_t* b, const uint8_t* c, const uint8_t* e, uint8_t* d, int n);     \
+    template <const GroupOrder& From, const GroupOrder& To>                                                         \
+    void reorderGroups(const uint8_t* s, uint8_t* d, int n);
 namespace portable {
-template <int SS, int DS, SampleMap M>
-void moveSamples(const uint8_t* s, uint8_t* d, int n);
-template <int SY, int SC, SampleMap M, int Y0, int CB, int CR>
-void buildGroups(const uint8_t* y, const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
-template <int SC, SampleMap M>
-void buildPairs(const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
-template <int SC>
-void buildQuads(const uint8_t* a, const uint8_t* b, const uint8_t* c, const uint8_t* e, uint8_t* d, int n);
-template <const GroupOrder& From, const GroupOrder& To>
-void reorderGroups(const uint8_t* s, uint8_t* d, int n);
+ZOX_REPACK_LOOPS
 }
 namespace sse41 {
-template <int SS, int DS, SampleMap M>
-void moveSamples(const uint8_t* s, uint8_t* d, int n);
-template <int SY, int SC, SampleMap M, int Y0, int CB, int CR>
-void buildGroups(const uint8_t* y, const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
-template <int SC, SampleMap M>
-void buildPairs(const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
-template <int SC>
-void buildQuads(const uint8_t* a, const uint8_t* b, const uint8_t* c, const uint8_t* e, uint8_t* d, int n);
-template <const GroupOrder& From, const GroupOrder& To>
-void reorderGroups(const uint8_t* s, uint8_t* d, int n);
+ZOX_REPACK_LOOPS
 }
 namespace avx2 {
-template <int SS, int DS, SampleMap M>
-void moveSamples(const uint8_t* s, uint8_t* d, int n);
-template <int SY, int SC, SampleMap M, int Y0, int CB, int CR>
-void buildGroups(const uint8_t* y, const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
-template <int SC, SampleMap M>
-void buildPairs(const uint8_t* cb, const uint8_t* cr, uint8_t* d, int n);
-template <int SC>
-void buildQuads(const uint8_t* a, const uint8_t* b, const uint8_t* c, const uint8_t* e, uint8_t* d, int n);
-template <const GroupOrder& From, const GroupOrder& To>
-void reorderGroups(const uint8_t* s, uint8_t* d, int n);
+ZOX_REPACK_LOOPS
 }
 
 template <KernelSet K, int SS, int DS, SampleMap M>
@@ -204,15 +189,15 @@ void repackPass(const RepackSide<const uint8_t>& s, const RepackSide<uint8_t>& d
     using S = typename C::Src;
     using D = typename C::Dst;
     constexpr int SS = S::chromaStride, DS = D::chromaStride;
-    constexpr ChromaRule R0 = C::rule;
+    constexpr ChromaRule R = C::rule;
     if constexpr (requires { D::order; }) { // groups: each row's luma and chroma in one pass
-        constexpr SampleMap M = R0 == ChromaRule::SampleRepeat ? SampleMap::Repeat : SampleMap::Same;
+        constexpr SampleMap M = R == ChromaRule::SampleRepeat ? SampleMap::Repeat : SampleMap::Same;
         if constexpr (requires { S::order; }) { // groups to groups: a byte order to another
             reorderRun<K, S::order, D::order>(rowAddress(s.plane[0], s.step[0], p), rowAddress(d.plane[0], d.step[0], p), w / 2);
             return;
         }
         for (int k = 0; k < C::passRows; ++k) {
-            const int r = p * C::passRows + k, j = R0 == ChromaRule::RowRepeat ? p : r;
+            const int r = p * C::passRows + k, j = R == ChromaRule::RowRepeat ? p : r;
             groupsRun<K, S::lumaStride, SS, M, D::order>(lumaRow<S>(s, r), chromaRow<S>(s, 0, j), chromaRow<S>(s, 1, j),
                                                           rowAddress(d.plane[0], d.step[0], r), w / 2);
         }
@@ -225,7 +210,6 @@ void repackPass(const RepackSide<const uint8_t>& s, const RepackSide<uint8_t>& d
         else
             moveRun<K, S::lumaStride, D::lumaStride, SampleMap::Same>(lumaRow<S>(s, r), lumaRow<D>(d, r), w);
     }
-    constexpr ChromaRule R = C::rule;
     const int dn = chromaPerRow(D::sampling, w);
     // A run of dn samples of one row, by the row copy where both runs are plain bytes.
     auto run = [&](const uint8_t* from, uint8_t* to) {
