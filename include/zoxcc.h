@@ -398,6 +398,94 @@ ZOXCC_API zoxStatus zoxiGammaInv_32f_AC4IR(float* srcDst, int srcDstStep, ImageS
 ZOXCC_API zoxStatus zoxiGammaInv_32f_P3R(const float* const src[3], int srcStep, float* const dst[3], int dstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
 ZOXCC_API zoxStatus zoxiGammaInv_32f_IP3R(float* const srcDst[3], int srcDstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
 
+/* ---- Colour twist, 8u / 8s / 16u / 16s / 32f ---------------------------------------------------------
+ * An affine map of the three colour channels: output channel i is a sum of the three inputs times
+ * twist[i][0..2] plus the offset twist[i][3] (in sample units), in single precision with each step
+ * rounded: (twist[i][3] + c0 x twist[i][0]) + (c2 x twist[i][2] + c1 x twist[i][1]), at 8s
+ * ((c0 x twist[i][0] + c1 x twist[i][1]) + c2 x twist[i][2]) + twist[i][3]. Integer depths limit the sum to
+ * the depth's range (8s from above to 127 only, then saturate through 32, 16 and 8 bits), a NaN sum to
+ * the upper limit, and round to nearest with ties to even whatever rounding mode the caller has set (the
+ * mode is set to nearest for the call and put back); 32f stores the sums, in the caller's mode.
+ * Layouts: C3; AC4, the fourth channel neither read nor written; P3, three planes with one step; I, in
+ * place. zoxiColorTwist_32f_C4R maps four channels by a 4x4 matrix, no offsets:
+ * ((c0 x m[i][0] + c1 x m[i][1]) + c2 x m[i][2]) + c3 x m[i][3].
+ * Checks: zoxStatusNullPointer for a null image, plane or matrix; zoxStatusBadSize for a size below 1;
+ * zoxStatusBadStep for a step below 1. */
+ZOXCC_API zoxStatus zoxiColorTwist32f_8u_C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_8u_C3IR(uint8_t* srcDst, int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_8u_AC4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_8u_AC4IR(uint8_t* srcDst, int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_8u_P3R(const uint8_t* const src[3], int srcStep, uint8_t* const dst[3], int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_8u_IP3R(uint8_t* const srcDst[3], int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_8s_C3R(const int8_t* src, int srcStep, int8_t* dst, int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_8s_C3IR(int8_t* srcDst, int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_8s_AC4R(const int8_t* src, int srcStep, int8_t* dst, int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_8s_AC4IR(int8_t* srcDst, int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_8s_P3R(const int8_t* const src[3], int srcStep, int8_t* const dst[3], int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_8s_IP3R(int8_t* const srcDst[3], int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_16u_C3R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_16u_C3IR(uint16_t* srcDst, int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_16u_AC4R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_16u_AC4IR(uint16_t* srcDst, int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_16u_P3R(const uint16_t* const src[3], int srcStep, uint16_t* const dst[3], int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_16u_IP3R(uint16_t* const srcDst[3], int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_16s_C3R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_16s_C3IR(int16_t* srcDst, int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_16s_AC4R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_16s_AC4IR(int16_t* srcDst, int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_16s_P3R(const int16_t* const src[3], int srcStep, int16_t* const dst[3], int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist32f_16s_IP3R(int16_t* const srcDst[3], int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist_32f_C3R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist_32f_C3IR(float* srcDst, int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist_32f_AC4R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist_32f_AC4IR(float* srcDst, int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist_32f_P3R(const float* const src[3], int srcStep, float* const dst[3], int dstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist_32f_IP3R(float* const srcDst[3], int srcDstStep, ImageSize roiSize, const float twist[3][4]);
+ZOXCC_API zoxStatus zoxiColorTwist_32f_C4R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize, const float twist[4][4]);
+
+/* ---- Gray conversions, 8u / 16u / 16s / 32f / 64f ---------------------------------------------------
+ * RGBToGray takes the weights 0.299, 0.587, 0.114 (channel 0, 1, 2 in memory order); ColorToGray the
+ * caller's coeffs, a null pointer standing for the same fixed set (but at 64f AC4C1, which rejects it).
+ * 8u works in fixed point, the weights in Q15 (the fixed ones 9798, 19235, 3736): in blocks of 8 pixels
+ * (and, from C3, one of 4: the columns below width & ~3, from AC4 below width & ~7) each product is
+ * (s x w) >> 8, the three and 64 are summed with 16-bit unsigned saturation and shifted right by 7 as a
+ * signed 16-bit value, limited to 0..255; the other columns store the low byte of
+ * (s0 w0 + s1 w1 + s2 w2 + 16384) >> 15. So (0, 6, 70) gives 11 in a block and 12 in the last columns.
+ * 16u and 16s: (s0 c0 + s1 c1) + s2 c2 in single precision (16s samples plus 32768), rounded to nearest,
+ * ties to even; 16s minus 32768, saturated in blocks of 4 and kept to the low 16 bits after them. 32f:
+ * (c0 s0 + c1 s1) + c2 s2. 64f: (s0 c0 + s1 c1) + s2 c2 in double precision; from C3 the row goes by
+ * pairs of destination samples (one lone first pixel when the destination row is not on 16 bytes), and
+ * the second of each pair sums s0 c0 + (s1 c1 + s2 c2). AC4C1 sources: channel 3 is not used.
+ * GrayToRGB copies the sample to three channels, C1C4R the fourth taking alpha. YCbCr422ToGray takes the
+ * luma bytes of a packed 4:2:2 row (byte 2x for pixel x; an odd width ends on a plain pixel).
+ * 16-bit and 32f members take their steps in whole samples (rounded down); 8u and 64f in bytes as given.
+ * Checks: zoxStatusNullPointer for src or dst, then zoxStatusBadSize for a size below 1. */
+ZOXCC_API zoxStatus zoxiRGBToGray_8u_C3C1R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToGray_8u_AC4C1R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToGray_16u_C3C1R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToGray_16u_AC4C1R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToGray_16s_C3C1R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToGray_16s_AC4C1R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToGray_32f_C3C1R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToGray_32f_AC4C1R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiColorToGray_8u_C3C1R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, const float coeffs[3]);
+ZOXCC_API zoxStatus zoxiColorToGray_8u_AC4C1R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, const float coeffs[3]);
+ZOXCC_API zoxStatus zoxiColorToGray_16u_C3C1R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize, const float coeffs[3]);
+ZOXCC_API zoxStatus zoxiColorToGray_16u_AC4C1R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize, const float coeffs[3]);
+ZOXCC_API zoxStatus zoxiColorToGray_16s_C3C1R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize, const float coeffs[3]);
+ZOXCC_API zoxStatus zoxiColorToGray_16s_AC4C1R(const int16_t* src, int srcStep, int16_t* dst, int dstStep, ImageSize roiSize, const float coeffs[3]);
+ZOXCC_API zoxStatus zoxiColorToGray_32f_C3C1R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize, const float coeffs[3]);
+ZOXCC_API zoxStatus zoxiColorToGray_32f_AC4C1R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize, const float coeffs[3]);
+ZOXCC_API zoxStatus zoxiColorToGray_64f_C3C1R(const double* src, int srcStep, double* dst, int dstStep, ImageSize roiSize, const double coeffs[3]);
+ZOXCC_API zoxStatus zoxiColorToGray_64f_AC4C1R(const double* src, int srcStep, double* dst, int dstStep, ImageSize roiSize, const double coeffs[3]);
+ZOXCC_API zoxStatus zoxiGrayToRGB_8u_C1C3R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGrayToRGB_8u_C1C4R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize, uint8_t alpha);
+ZOXCC_API zoxStatus zoxiGrayToRGB_16u_C1C3R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGrayToRGB_16u_C1C4R(const uint16_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize, uint16_t alpha);
+ZOXCC_API zoxStatus zoxiGrayToRGB_32f_C1C3R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiGrayToRGB_32f_C1C4R(const float* src, int srcStep, float* dst, int dstStep, ImageSize roiSize, float alpha);
+ZOXCC_API zoxStatus zoxiYCbCr422ToGray_8u_C2C1R(const uint8_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+
 /* ---- RGB <-> YCoCg, 8u / 16s / 32s --------------------------------------------------------------------
  * Y = (R + 2G + B + 2) >> 2, Co = (R - B + 1) >> 1, Cg = (2G - R - B + 2) >> 2 (plain), or the reversible
  * lifting form (_Rev): Co = R - B, t = B + (Co >> 1), Cg = G - t, Y = t + (Cg >> 1), undone exactly by

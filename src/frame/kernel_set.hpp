@@ -6,6 +6,7 @@
 #include "zoxcore.h"
 
 #include <cstdint>
+#include <type_traits>
 
 #if !defined(ZOX_HAVE_SSE41)
 #define ZOX_HAVE_SSE41 0
@@ -42,6 +43,23 @@ inline KernelSet activeKernelSet()
         return gLoadedKernelSet;
     else
         return kBuiltKernelSet;
+}
+
+template <KernelSet K>
+using KernelSetTag = std::integral_constant<KernelSet, K>;
+
+// Calls f(KernelSetTag<K>{}) with the set this call runs, as a constant of the call's code.
+template <class F>
+inline void withActiveKernelSet(F&& f)
+{
+    if constexpr (kChosenAtLoad) {
+        if (gLoadedKernelSet == KernelSet::Avx2)
+            f(KernelSetTag<KernelSet::Avx2>{});
+        else
+            f(KernelSetTag<KernelSet::Sse41>{});
+    } else {
+        f(KernelSetTag<kBuiltKernelSet>{});
+    }
 }
 
 constexpr const char* kernelSetName(KernelSet k)

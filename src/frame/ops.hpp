@@ -36,4 +36,27 @@ constexpr uint8_t limit1(int x)
     return static_cast<uint8_t>(x < 1 ? 1 : (x > 254 ? 254 : x));
 }
 
+// A float to a 32-bit integer as the processor's conversion with rounding to nearest gives it: ties to
+// even, and the integer indefinite (INT32_MIN) for NaN and for values out of range.
+inline int32_t roundToInt32(float v)
+{
+    if (!(v >= -2147483648.0f && v < 2147483648.0f))
+        return INT32_MIN;
+    return static_cast<int32_t>(__builtin_roundevenf(v));
+}
+
+// The same conversion truncating, from double.
+inline int32_t truncateToInt32(double v)
+{
+    if (!(v > -2147483649.0 && v < 2147483648.0))
+        return INT32_MIN;
+    return static_cast<int32_t>(v);
+}
+
+// The unsigned 16-bit saturating sum.
+constexpr int addSatU16(int a, int b)
+{
+    return a + b > 65535 ? 65535 : a + b;
+}
+
 } // namespace zox

@@ -170,3 +170,28 @@ template <int Byte>
 inline void storeQuarters(uint8_t* q, std::size_t, V v) { store4(q, _mm_srli_si128(v, Byte)); }
 inline V min16(V a, V b) { return _mm_min_epi16(a, b); }
 inline V max16(V a, V b) { return _mm_max_epi16(a, b); }
+
+// Unsigned 16-bit saturating sums.
+inline V addSatU(V a, V b) { return _mm_adds_epu16(a, b); }
+
+// Single precision, four lanes: each operation rounded on its own in the caller's rounding mode. minF and
+// maxF are the processor's: a NaN in a gives b. toNearestInt rounds to nearest with ties to even whatever
+// the mode, and gives INT32_MIN for NaN and values out of range. The pixel-group loads and stores move
+// 16 bytes at q (and, in wider sets, 16 bytes at q + g for the next group of four).
+using VF = __m128;
+inline constexpr int kFloatLanes = 4;
+inline VF splatF(float v) { return _mm_set1_ps(v); }
+inline VF addF(VF a, VF b) { return _mm_add_ps(a, b); }
+inline VF mulF(VF a, VF b) { return _mm_mul_ps(a, b); }
+inline VF minF(VF a, VF b) { return _mm_min_ps(a, b); }
+inline VF maxF(VF a, VF b) { return _mm_max_ps(a, b); }
+inline VF toFloat(V i32) { return _mm_cvtepi32_ps(i32); }
+inline V toNearestInt(VF v) { return _mm_cvtps_epi32(_mm_round_ps(v, _MM_FROUND_TO_NEAREST_INT | _MM_FROUND_NO_EXC)); }
+template <int M>
+inline VF blendF(VF a, VF b) { return _mm_blend_ps(a, b, M); }
+template <int I>
+inline VF permuteF(VF a) { return _mm_shuffle_ps(a, a, I); }
+inline VF loadF(const uint8_t* q) { return _mm_loadu_ps(reinterpret_cast<const float*>(q)); }
+inline void storeF(uint8_t* q, VF v) { _mm_storeu_ps(reinterpret_cast<float*>(q), v); }
+inline VF loadLanesF(const uint8_t* q, std::size_t) { return loadF(q); }
+inline void storeLanesF(uint8_t* q, std::size_t, VF v) { storeF(q, v); }

@@ -206,4 +206,32 @@ inline void storeQuarters(uint8_t* q, std::size_t g, V v)
 inline V min16(V a, V b) { return _mm256_min_epi16(a, b); }
 inline V max16(V a, V b) { return _mm256_max_epi16(a, b); }
 
+inline V addSatU(V a, V b) { return _mm256_adds_epu16(a, b); }
+
+// Single precision, eight lanes (see the SSE4.1 set); blendF and permuteF act within each 128-bit lane, and
+// the pixel-group loads and stores take the upper lane g bytes on.
+using VF = __m256;
+inline constexpr int kFloatLanes = 8;
+inline VF splatF(float v) { return _mm256_set1_ps(v); }
+inline VF addF(VF a, VF b) { return _mm256_add_ps(a, b); }
+inline VF mulF(VF a, VF b) { return _mm256_mul_ps(a, b); }
+inline VF minF(VF a, VF b) { return _mm256_min_ps(a, b); }
+inline VF maxF(VF a, VF b) { return _mm256_max_ps(a, b); }
+inline VF toFloat(V i32) { return _mm256_cvtepi32_ps(i32); }
+inline V toNearestInt(VF v) { return _mm256_cvtps_epi32(_mm256_round_ps(v, _MM_FROUND_TO_NEAREST_INT | _MM_FROUND_NO_EXC)); }
+template <int M>
+inline VF blendF(VF a, VF b) { return _mm256_blend_ps(a, b, M | (M << 4)); }
+template <int I>
+inline VF permuteF(VF a) { return _mm256_permute_ps(a, I); }
+inline VF loadF(const uint8_t* q) { return _mm256_loadu_ps(reinterpret_cast<const float*>(q)); }
+inline void storeF(uint8_t* q, VF v) { _mm256_storeu_ps(reinterpret_cast<float*>(q), v); }
+inline VF loadLanesF(const uint8_t* q, std::size_t g)
+{
+    return _mm256_loadu2_m128(reinterpret_cast<const float*>(q + g), reinterpret_cast<const float*>(q));
+}
+inline void storeLanesF(uint8_t* q, std::size_t g, VF v)
+{
+    _mm256_storeu2_m128(reinterpret_cast<float*>(q + g), reinterpret_cast<float*>(q), v);
+}
+
 } // namespace zox::avx2

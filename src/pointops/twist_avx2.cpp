@@ -1,0 +1,12 @@
+// AVX2 kernels of the colour twist: 8u and 32f three-channel rows in single-precision lanes,
+// the others the members' rows vectorised by the compiler.
+#include "frame/ops_avx2.hpp"
+#include "frame/layouts.hpp"
+#include "pointops/twist_table.hpp"
+
+namespace zox::avx2 {
+#include "frame/io_simd.inl"
+#include "pointops/twist_simd.inl"
+
+ZOX_TWIST_MEMBERS(ZOX_INSTANTIATE_TWIST)
+} // namespace zox::avx2
