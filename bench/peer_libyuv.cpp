@@ -123,6 +123,8 @@ void registerLibyuvPeers()
                          const int w = s.width, h = s.height;
                          libyuv::I420ToUYVY(in, w, in + w * h, w / 2, in + w * h + w / 2 * (h / 2), w / 2, o, 2 * w, w, h);
                      });
+        unsamplePeer("libyuv RGB24ToJ400", {"zoxiRGBToGray_8u_C3C1R"}, size, 3 * luma, luma,
+                     [](const uint8_t* in, uint8_t* o, Size s) { libyuv::RGB24ToJ400(in, 3 * s.width, o, s.width, s.width, s.height); });
         unsamplePeer("libyuv YUY2ToARGB", {"zoxiYCbCr422ToRGB_8u_C2C3R"}, size, 2 * luma, 4 * luma,
                      [](const uint8_t* in, uint8_t* o, Size s) { libyuv::YUY2ToARGB(in, 2 * s.width, o, 4 * s.width, s.width, s.height); });
     }

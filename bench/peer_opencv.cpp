@@ -32,6 +32,40 @@ void registerCvtColor(const std::string& name, int code, const std::string& ours
     }
 }
 
+// cvtColor to one channel, and cv::transform with a 3x4 matrix, at 8u and 32f.
+void registerGrayAndTransform()
+{
+    for (Size size : kSizes) {
+        const std::size_t px = static_cast<std::size_t>(size.width) * size.height;
+        registerPeer("OpenCV RGB2GRAY", {"zoxiRGBToGray_8u_C3C1R"}, size, px * 4, [](Size s) -> Call {
+            auto src = std::make_shared<cv::Mat>(s.height, s.width, CV_8UC3);
+            const std::vector<uint8_t> bytes = randomBytes(std::size_t(s.width) * s.height * 3);
+            std::memcpy(src->data, bytes.data(), bytes.size());
+            auto dst = std::make_shared<cv::Mat>(s.height, s.width, CV_8UC1);
+            return [src, dst] { cv::cvtColor(*src, *dst, cv::COLOR_RGB2GRAY); };
+        });
+        for (int type : {CV_8UC3, CV_32FC3}) {
+            const std::size_t sample = type == CV_32FC3 ? 4 : 1;
+            const char* ours = type == CV_32FC3 ? "zoxiColorTwist_32f_C3R" : "zoxiColorTwist32f_8u_C3R";
+            registerPeer(type == CV_32FC3 ? "OpenCV transform 32f" : "OpenCV transform 8u", {ours}, size, px * 6 * sample,
+                         [type](Size s) -> Call {
+                             auto src = std::make_shared<cv::Mat>(s.height, s.width, type);
+                             const std::size_t n = std::size_t(s.width) * s.height * 3;
+                             const std::vector<uint8_t> bytes = randomBytes(n);
+                             for (std::size_t i = 0; i < n; ++i) {
+                                 if (type == CV_32FC3)
+                                     reinterpret_cast<float*>(src->data)[i] = bytes[i] / 255.0f;
+                                 else
+                                     src->data[i] = bytes[i];
+                             }
+                             auto dst = std::make_shared<cv::Mat>(s.height, s.width, type);
+                             auto m = std::make_shared<cv::Mat>(cv::Mat_<float>({3, 4}, {0.9f, 0.1f, 0.05f, 2, 0.05f, 0.8f, 0.1f, 1, 0.1f, 0.05f, 0.9f, -3}));
+                             return [src, dst, m] { cv::transform(*src, *dst, *m); };
+                         });
+        }
+    }
+}
+
 } // namespace
 
 void registerOpenCVPeers()
@@ -45,6 +79,7 @@ void registerOpenCVPeers()
     registerCvtColor("XYZ2RGB", cv::COLOR_XYZ2RGB, "zoxiXYZToRGB_8u_C3R");
     registerCvtColor("RGB2XYZ 32f", cv::COLOR_RGB2XYZ, "zoxiRGBToXYZ_32f_C3R", CV_32FC3);
     registerCvtColor("XYZ2RGB 32f", cv::COLOR_XYZ2RGB, "zoxiXYZToRGB_32f_C3R", CV_32FC3);
+    registerGrayAndTransform();
 }
 } // namespace zb
 #else

@@ -3,6 +3,7 @@ namespace zb {
 void registerConvFamilies();
 void registerSampledFamilies();
 void registerGammaFamily();
+void registerPointOps();
 void registerPlanesAndToneMaps();
 void registerLibyuvPeers();
 void registerOpenCVPeers();
@@ -12,6 +13,7 @@ void registerAll()
     registerConvFamilies();
     registerSampledFamilies();
     registerGammaFamily();
+    registerPointOps();
     registerPlanesAndToneMaps();
     registerLibyuvPeers();
     registerOpenCVPeers();

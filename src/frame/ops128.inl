@@ -195,3 +195,18 @@ inline VF loadF(const uint8_t* q) { return _mm_loadu_ps(reinterpret_cast<const f
 inline void storeF(uint8_t* q, VF v) { _mm_storeu_ps(reinterpret_cast<float*>(q), v); }
 inline VF loadLanesF(const uint8_t* q, std::size_t) { return loadF(q); }
 inline void storeLanesF(uint8_t* q, std::size_t, VF v) { storeF(q, v); }
+// The conversion in the processor's rounding mode (callers that need nearest set it for the call).
+inline V toIntInMode(VF v) { return _mm_cvtps_epi32(v); }
+inline VF asFloat(V v) { return _mm_castsi128_ps(v); }
+inline V asInt(VF v) { return _mm_castps_si128(v); }
+inline V packus32(V a, V b) { return _mm_packus_epi32(a, b); } // to 16 bits, unsigned saturation
+// Four 16-bit samples at q (and, in wider sets, four at q + g for the upper lane) widened to 32-bit lanes.
+template <bool Signed>
+inline V loadWidened16(const uint8_t* q, std::size_t)
+{
+    const V x = load8(q);
+    return Signed ? _mm_cvtepi16_epi32(x) : _mm_cvtepu16_epi32(x);
+}
+// A stream store of 16 bytes at q (16-byte aligned), past the caches; and the fence that ends a run of them.
+inline void streamLanesF(uint8_t* q, std::size_t, VF v) { _mm_stream_ps(reinterpret_cast<float*>(q), v); }
+inline void streamFence() { _mm_sfence(); }

@@ -233,5 +233,22 @@ inline void storeLanesF(uint8_t* q, std::size_t g, VF v)
 {
     _mm256_storeu2_m128(reinterpret_cast<float*>(q + g), reinterpret_cast<float*>(q), v);
 }
+inline V toIntInMode(VF v) { return _mm256_cvtps_epi32(v); }
+inline VF asFloat(V v) { return _mm256_castsi256_ps(v); }
+inline V asInt(VF v) { return _mm256_castps_si256(v); }
+inline V packus32(V a, V b) { return _mm256_packus_epi32(a, b); }
+template <bool Signed>
+inline V loadWidened16(const uint8_t* q, std::size_t g)
+{
+    const __m128i x = _mm_unpacklo_epi64(_mm_loadl_epi64(reinterpret_cast<const __m128i*>(q)),
+                                         _mm_loadl_epi64(reinterpret_cast<const __m128i*>(q + g)));
+    return Signed ? _mm256_cvtepi16_epi32(x) : _mm256_cvtepu16_epi32(x);
+}
+inline void streamLanesF(uint8_t* q, std::size_t g, VF v)
+{
+    _mm_stream_ps(reinterpret_cast<float*>(q), _mm256_castps256_ps128(v));
+    _mm_stream_ps(reinterpret_cast<float*>(q + g), _mm256_extractf128_ps(v, 1));
+}
+inline void streamFence() { _mm_sfence(); }
 
 } // namespace zox::avx2

@@ -91,7 +91,10 @@ zoxStatus twistRun(const void* const* src, int srcStep, void* const* dst, int ds
         return zoxStatusBadSize;
     if (srcStep < 1 || dstStep < 1)
         return zoxStatusBadStep;
-    const twist::Matrix m = twist::matrixOf(twist, M::rows);
+    twist::Matrix m = twist::matrixOf(twist, M::rows);
+    // Above 34992 samples a 32f image is written past the caches.
+    m.stream = std::is_floating_point_v<typename M::Sample> &&
+               static_cast<long long>(roi.width) * 3 * roi.height > 34992;
     const uint8_t* s[planes];
     uint8_t* d[planes];
     for (int p = 0; p < planes; ++p) {

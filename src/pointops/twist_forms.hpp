@@ -15,8 +15,11 @@ namespace zox::twist {
 
 // The coefficients of a call: row i makes output channel i from inputs 0..2 (columns 0..2) and an offset
 // in sample units (column 3). The 4x4 member has four rows and no offset.
+// `stream`: the call's rows are many (the 32f three-channel member then writes past the caches; the
+// samples are the same).
 struct Matrix {
     float m[4][4] = {};
+    bool stream = false;
 };
 
 inline Matrix matrixOf(const float* twist, int rows)

@@ -129,6 +129,28 @@ TEST(TwistPinned, CallersRoundingMode)
     }
 }
 
+TEST(TwistPinned, StreamingRowsGiveTheSameSamples)
+{
+    // 130 x 100 pixels pass 34992 samples: written past the caches, from destinations off 16 bytes too.
+    const int w = 130, h = 100;
+    zt::Rng rng(3);
+    std::vector<float> src(static_cast<std::size_t>(w + 1) * 3 * h);
+    for (float& v : src)
+        v = static_cast<float>(rng() % 1000) / 7.0f;
+    const float t[3][4] = {{0.5f, 0.25f, 0.125f, 1}, {1, 2, 3, 4}, {-1, 0.5f, 0.75f, -2}};
+    for (int pad : {0, 12})
+        for (int off : {0, 4, 8, 12}) {
+            const int step = w * 12 + pad;
+            std::vector<uint8_t> got(static_cast<std::size_t>(step) * h + 16), want(got.size());
+            const uint8_t* s[1] = {reinterpret_cast<const uint8_t*>(src.data())};
+            uint8_t* d[1] = {want.data() + off};
+            twistRows<twist::Twist32fC3, KernelSet::Portable>(s, step, d, step, {w, h}, twist::matrixOf(t[0], 3));
+            ASSERT_EQ(zoxiColorTwist_32f_C3R(src.data(), step, reinterpret_cast<float*>(got.data() + off), step, {w, h}, t),
+                      zoxStatusOk);
+            EXPECT_EQ(got, want) << "pad " << pad << " offset " << off;
+        }
+}
+
 TEST(TwistPinned, FourByFour)
 {
     // Channel 3 summed into channel 0; channel 3 transformed by the fourth row.
