@@ -210,3 +210,8 @@ inline V loadWidened16(const uint8_t* q, std::size_t)
 // A stream store of 16 bytes at q (16-byte aligned), past the caches; and the fence that ends a run of them.
 inline void streamLanesF(uint8_t* q, std::size_t, VF v) { _mm_stream_ps(reinterpret_cast<float*>(q), v); }
 inline void streamFence() { _mm_sfence(); }
+// Interleaving of 32-bit and 64-bit halves of float vectors (within each 128-bit lane).
+inline VF unpackLoF(VF a, VF b) { return _mm_unpacklo_ps(a, b); }
+inline VF unpackHiF(VF a, VF b) { return _mm_unpackhi_ps(a, b); }
+inline VF unpackLo64F(VF a, VF b) { return _mm_castpd_ps(_mm_unpacklo_pd(_mm_castps_pd(a), _mm_castps_pd(b))); }
+inline VF unpackHi64F(VF a, VF b) { return _mm_castpd_ps(_mm_unpackhi_pd(_mm_castps_pd(a), _mm_castps_pd(b))); }

@@ -250,5 +250,9 @@ inline void streamLanesF(uint8_t* q, std::size_t g, VF v)
     _mm_stream_ps(reinterpret_cast<float*>(q + g), _mm256_extractf128_ps(v, 1));
 }
 inline void streamFence() { _mm_sfence(); }
+inline VF unpackLoF(VF a, VF b) { return _mm256_unpacklo_ps(a, b); }
+inline VF unpackHiF(VF a, VF b) { return _mm256_unpackhi_ps(a, b); }
+inline VF unpackLo64F(VF a, VF b) { return _mm256_castpd_ps(_mm256_unpacklo_pd(_mm256_castps_pd(a), _mm256_castps_pd(b))); }
+inline VF unpackHi64F(VF a, VF b) { return _mm256_castpd_ps(_mm256_unpackhi_pd(_mm256_castps_pd(a), _mm256_castps_pd(b))); }
 
 } // namespace zox::avx2

@@ -6,6 +6,7 @@
 
 namespace zox::avx2 {
 #include "frame/io_simd.inl"
+#include "pointops/float_lanes.inl"
 #include "pointops/gray_simd.inl"
 
 ZOX_GRAY_MEMBERS(ZOX_INSTANTIATE_GRAY)

@@ -6,6 +6,7 @@
 
 namespace zox::sse41 {
 #include "frame/io_simd.inl"
+#include "pointops/float_lanes.inl"
 #include "pointops/gray_simd.inl"
 
 ZOX_GRAY_MEMBERS(ZOX_INSTANTIATE_GRAY)

@@ -46,6 +46,18 @@ inline V limitedInt(const MatrixLanes& t, int i, VF c0, VF c1, VF c2)
     return toIntInMode(minF(sumLanes<typename Dp::Sum>(t.m[i], c0, c1, c2), splatF(Dp::hi)));
 }
 
+// Pixels of four bytes whose fourth is kept: the results staged as three-byte pixels, then three bytes a
+// pixel.
+struct OutKeep8 {
+    using Row = OutPacked<4, Order::Rgb, Fourth::Keep>::Row;
+    static void put(const Row& d, int x, const V3& a, const V3& b, const Ctx& ctx)
+    {
+        alignas(32) uint8_t staged[3 * kGroupPixels];
+        GroupIo<OutPacked<3, Order::Rgb, Fourth::None>>::put({{staged}}, 0, a, b, ctx);
+        putThreeOfFour<1>(d.p[0] + static_cast<std::size_t>(x) * 4, staged, kGroupPixels);
+    }
+};
+
 // 8u and 8s: sixteen pixels a lane through the group readers, in 16-bit lanes, widened to 32-bit lanes
 // within each 128-bit lane (the pack undoes it). 8s is sign-extended on the way in, and on the way out
 // saturated through 16 bits to 8 and written as its low bytes.
@@ -80,7 +92,10 @@ struct Twist8Lanes {
             GroupIo<In>::template get<0>(s, x, a, b);
             apply(a, t);
             apply(b, t);
-            GroupIo<Out>::put(d, x, a, b, Ctx{});
+            if constexpr (std::is_same_v<Out, OutKeep8>)
+                Out::put(d, x, a, b, Ctx{});
+            else
+                GroupIo<Out>::put(d, x, a, b, Ctx{});
         }
         return x;
     }
@@ -92,90 +107,10 @@ struct Twist8For {
     {
         if constexpr (std::is_same_v<L, twist::C3>)
             return Twist8Lanes<T, InPacked<3>, OutPacked<3, Order::Rgb, Fourth::None>>::run({{s[0]}}, {{d[0]}}, w, m);
+        else if constexpr (std::is_same_v<L, twist::AC4>)
+            return Twist8Lanes<T, InPacked<4>, OutKeep8>::run({{s[0]}}, {{d[0]}}, w, m);
         else
             return Twist8Lanes<T, InPlanar<3>, OutPlanar<3>>::run({{s[0], s[1], s[2]}}, {{d[0], d[1], d[2]}}, w, m);
-    }
-};
-
-// Three channels of four interleaved 32-bit lanes a 128-bit lane, to and from one vector a channel: blends
-// and in-lane permutes.
-struct Split3 {
-    static void split(VF a, VF b, VF c, VF (&v)[3])
-    {
-        v[0] = permuteF<_MM_SHUFFLE(1, 2, 3, 0)>(blendF<0b0010>(blendF<0b0100>(a, b), c)); // a0 a3 b2 c1
-        v[1] = permuteF<_MM_SHUFFLE(2, 3, 0, 1)>(blendF<0b0100>(blendF<0b1001>(a, b), c)); // a1 b0 b3 c2
-        v[2] = permuteF<_MM_SHUFFLE(3, 0, 1, 2)>(blendF<0b1001>(blendF<0b0010>(a, b), c)); // a2 b1 c0 c3
-    }
-    static void join(VF v0, VF v1, VF v2, VF& a, VF& b, VF& c)
-    {
-        const VF t0 = permuteF<_MM_SHUFFLE(1, 2, 3, 0)>(v0); // x0 x3 x2 x1
-        const VF t1 = permuteF<_MM_SHUFFLE(2, 3, 0, 1)>(v1); // y1 y0 y3 y2
-        const VF t2 = permuteF<_MM_SHUFFLE(3, 0, 1, 2)>(v2); // z2 z1 z0 z3
-        a = blendF<0b0100>(blendF<0b0010>(t0, t1), t2);
-        b = blendF<0b0100>(blendF<0b0010>(t1, t2), t0);
-        c = blendF<0b0100>(blendF<0b0010>(t2, t0), t1);
-    }
-};
-
-// The pixels of one turn (four a 128-bit lane, the upper lane's four next in the row) as one float vector
-// a channel, read from and written to a layout of 16-bit or 32f samples.
-template <class T, class L>
-struct FloatTurn {
-    static constexpr bool planar = L::planes == 3;
-    static constexpr std::size_t z = sizeof(T);
-    static constexpr std::size_t lane = planar ? 4 * z : 12 * z; // bytes of one lane's four pixels
-    static VF widened(const uint8_t* q)
-    {
-        if constexpr (std::is_same_v<T, float>)
-            return planar ? loadF(q) : loadLanesF(q, lane);
-        else
-            return toFloat(loadWidened16<std::is_signed_v<T>>(q, lane));
-    }
-    static void get(const uint8_t* const* s, int x, VF (&c)[3])
-    {
-        if constexpr (planar) {
-#pragma GCC unroll 3
-            for (int k = 0; k < 3; ++k)
-                c[k] = widened(s[k] + static_cast<std::size_t>(x) * z);
-        } else {
-            const uint8_t* q = s[0] + static_cast<std::size_t>(x) * 3 * z;
-            Split3::split(widened(q), widened(q + 4 * z), widened(q + 8 * z), c);
-        }
-    }
-    // 32-bit lanes of 16-bit results to 16 bits with the depth's saturation.
-    static V pack(V a, V b) { return std::is_signed_v<T> ? packs32(a, b) : packus32(a, b); }
-    template <bool Stream>
-    static void put(uint8_t* const* d, int x, VF o0, VF o1, VF o2)
-    {
-        if constexpr (planar) {
-            const VF o[3] = {o0, o1, o2};
-#pragma GCC unroll 3
-            for (int k = 0; k < 3; ++k) {
-                uint8_t* q = d[k] + static_cast<std::size_t>(x) * z;
-                if constexpr (std::is_same_v<T, float>)
-                    storeF(q, o[k]);
-                else
-                    storeLowHalves(q, lane, pack(asInt(o[k]), asInt(o[k])));
-            }
-        } else {
-            uint8_t* q = d[0] + static_cast<std::size_t>(x) * 3 * z;
-            VF a, b, c;
-            Split3::join(o0, o1, o2, a, b, c);
-            if constexpr (std::is_same_v<T, float>) {
-                if constexpr (Stream) {
-                    streamLanesF(q, lane, a);
-                    streamLanesF(q + 16, lane, b);
-                    streamLanesF(q + 32, lane, c);
-                } else {
-                    storeLanesF(q, lane, a);
-                    storeLanesF(q + 16, lane, b);
-                    storeLanesF(q + 32, lane, c);
-                }
-            } else {
-                storeLanes(q, lane, pack(asInt(a), asInt(b)));
-                storeLowHalves(q + 16, lane, pack(asInt(c), asInt(c)));
-            }
-        }
     }
 };
 
@@ -183,7 +118,7 @@ struct FloatTurn {
 // writes singly up to 16 bytes, then whole turns past the caches.
 template <class T, class L>
 struct TwistFloatLanes {
-    using Turn = FloatTurn<T, L>;
+    using Turn = FloatTurn<T, L::stride, L::planes == 3>;
     template <bool Stream>
     static int turns(const uint8_t* const* s, uint8_t* const* d, int x, int w, const MatrixLanes& t)
     {
@@ -205,7 +140,7 @@ struct TwistFloatLanes {
     static int run(const uint8_t* const* s, uint8_t* const* d, int w, const twist::Matrix& m)
     {
         const MatrixLanes t(m);
-        if constexpr (std::is_same_v<T, float> && !Turn::planar) {
+        if constexpr (std::is_same_v<T, float> && L::stride == 3) {
             const auto at = reinterpret_cast<uintptr_t>(d[0]);
             if (m.stream && at % 4 == 0) {
                 // Pixels of 12 bytes: at most three singly before the destination lies on 16 bytes.
@@ -223,11 +158,41 @@ struct TwistFloatLanes {
 };
 
 template <class T, class L>
-    requires(sizeof(T) == 1 && !std::is_same_v<L, twist::AC4>)
+    requires(sizeof(T) == 1)
 struct TwistKernel<twist::Twist3<T, L>> : Twist8For<T, L> {};
 template <class T, class L>
-    requires(sizeof(T) > 1 && !std::is_same_v<L, twist::AC4>)
+    requires(sizeof(T) > 1)
 struct TwistKernel<twist::Twist3<T, L>> : TwistFloatLanes<T, L> {};
+
+// The 4x4 map: four pixels a 128-bit lane transposed to one vector a channel and back.
+template <>
+struct TwistKernel<twist::Twist4> {
+    static int run(const uint8_t* const* s, uint8_t* const* d, int w, const twist::Matrix& t)
+    {
+        VF m[4][4];
+#pragma GCC unroll 4
+        for (int i = 0; i < 4; ++i)
+#pragma GCC unroll 4
+            for (int j = 0; j < 4; ++j)
+                m[i][j] = splatF(t.m[i][j]);
+        int x = 0;
+        for (; x + kFloatLanes <= w; x += kFloatLanes) {
+            const uint8_t* q = s[0] + static_cast<std::size_t>(x) * 16;
+            VF c[4] = {loadLanesF(q, 64), loadLanesF(q + 16, 64), loadLanesF(q + 32, 64), loadLanesF(q + 48, 64)};
+            transpose4(c);
+            VF o[4];
+#pragma GCC unroll 4
+            for (int i = 0; i < 4; ++i)
+                o[i] = addF(addF(addF(mulF(c[0], m[i][0]), mulF(c[1], m[i][1])), mulF(c[2], m[i][2])), mulF(c[3], m[i][3]));
+            transpose4(o);
+            uint8_t* p = d[0] + static_cast<std::size_t>(x) * 16;
+#pragma GCC unroll 4
+            for (int k = 0; k < 4; ++k)
+                storeLanesF(p + 16 * k, 64, o[k]);
+        }
+        return x;
+    }
+};
 
 template <class M>
 int twistKernel(const uint8_t* const* s, uint8_t* const* d, int w, const twist::Matrix& m)

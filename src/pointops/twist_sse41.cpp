@@ -6,6 +6,7 @@
 
 namespace zox::sse41 {
 #include "frame/io_simd.inl"
+#include "pointops/float_lanes.inl"
 #include "pointops/twist_simd.inl"
 
 ZOX_TWIST_MEMBERS(ZOX_INSTANTIATE_TWIST)
