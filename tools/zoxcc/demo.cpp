@@ -288,6 +288,8 @@ const std::vector<FamilyDemo>& familyDemos()
         {"Tone mapping", toneMapDemo},
         {"RGB to 4:2:0, 4:2:2 and 4:1:1 and back", sampledDemo},
         {"Repacking among samplings and layouts", repackDemo},
+        {"Gray conversions", grayDemo},
+        {"Colour twist", twistDemo},
     };
     return demos;
 }

@@ -41,4 +41,8 @@ struct FamilyDemo {
 };
 const std::vector<FamilyDemo>& familyDemos();
 
+// Families whose demos live in files of their own.
+void grayDemo(Demo& d);
+void twistDemo(Demo& d);
+
 } // namespace zt
