@@ -88,10 +88,7 @@ zoxStatus grayRun(const void* src, int srcStep, void* dst, int dstStep, ImageSiz
 #define ZOX_GRAY_ALPHA(name, M)                                                                          \
     ZOXCC_API zoxStatus name(ZOX_GRAY_ARGS(M), M::D alpha)                                               \
     {                                                                                                     \
-        ::zox::gray::Params p;                                                                            \
-        p.alphaF = static_cast<float>(alpha);                                                             \
-        p.alphaI = static_cast<int>(alpha);                                                               \
-        return ::zox::grayRun<M>(src, srcStep, dst, dstStep, roiSize, p);                                 \
+        return ::zox::grayRun<M>(src, srcStep, dst, dstStep, roiSize, ::zox::gray::paramsWithAlpha(alpha)); \
     }
 
 #define ZOX_DEFINE_GRAY(name, shape, M) shape(name, M)

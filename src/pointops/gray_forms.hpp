@@ -59,6 +59,18 @@ inline Params paramsOf(const double* coeffs)
     return p;
 }
 
+// The fourth channel of gray to colour, in the member's sample type.
+template <class T>
+inline Params paramsWithAlpha(T alpha)
+{
+    Params p;
+    if constexpr (std::is_floating_point_v<T>)
+        p.alphaF = alpha;
+    else
+        p.alphaI = alpha;
+    return p;
+}
+
 template <class T>
 inline T sampleAt(const uint8_t* row, std::size_t i)
 {

@@ -137,7 +137,9 @@ struct TwistFloatLanes {
         }
         return x;
     }
-    static int run(const uint8_t* const* s, uint8_t* const* d, int w, const twist::Matrix& m)
+    // Flattened: the scalar lead pixels are inlined here, so that no shared inline function is emitted
+    // with this set's instructions.
+    [[gnu::flatten]] static int run(const uint8_t* const* s, uint8_t* const* d, int w, const twist::Matrix& m)
     {
         const MatrixLanes t(m);
         if constexpr (std::is_same_v<T, float> && L::stride == 3) {

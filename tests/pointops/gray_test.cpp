@@ -37,10 +37,9 @@ gray::Params paramsFor(F, const float* wf, const double* wd, typename M::D alpha
         return gray::paramsOf(wf);
     else if constexpr (std::is_invocable_v<F, S, int, D, int, ImageSize, const double*>)
         return gray::paramsOf(wd);
-    gray::Params p = gray::paramsOf(static_cast<const float*>(nullptr));
-    p.alphaF = static_cast<float>(alpha);
-    p.alphaI = static_cast<int>(alpha);
-    return p;
+    else if constexpr (std::is_invocable_v<F, S, int, D, int, ImageSize, typename M::D>)
+        return gray::paramsWithAlpha(alpha);
+    return gray::paramsOf(static_cast<const float*>(nullptr));
 }
 
 template <class M, class F>
