@@ -26,7 +26,13 @@ using Spread32fC4 = Spread<float, 4>;
 } // namespace zox::gray
 
 // Every member once, for the kernel instantiations.
-#define ZOX_GRAY_MEMBERS(X) X(::zox::gray::Gray8C3) X(::zox::gray::Gray8AC4) X(::zox::gray::Gray16uC3) X(::zox::gray::Gray16uAC4) X(::zox::gray::Gray16sC3) X(::zox::gray::Gray16sAC4) X(::zox::gray::Gray32fC3) X(::zox::gray::Gray32fAC4) X(::zox::gray::Gray64fC3) X(::zox::gray::Gray64fAC4) X(::zox::gray::Spread8C3) X(::zox::gray::Spread8C4) X(::zox::gray::Spread16uC3) X(::zox::gray::Spread16uC4) X(::zox::gray::Spread32fC3) X(::zox::gray::Spread32fC4) X(::zox::gray::LumaBytes)
+#define ZOX_GRAY_MEMBERS(X) \
+    X(::zox::gray::Gray8C3) X(::zox::gray::Gray8AC4) X(::zox::gray::Gray16uC3) \
+    X(::zox::gray::Gray16uAC4) X(::zox::gray::Gray16sC3) X(::zox::gray::Gray16sAC4) \
+    X(::zox::gray::Gray32fC3) X(::zox::gray::Gray32fAC4) X(::zox::gray::Gray64fC3) \
+    X(::zox::gray::Gray64fAC4) X(::zox::gray::Spread8C3) X(::zox::gray::Spread8C4) \
+    X(::zox::gray::Spread16uC3) X(::zox::gray::Spread16uC4) X(::zox::gray::Spread32fC3) \
+    X(::zox::gray::Spread32fC4) X(::zox::gray::LumaBytes)
 
 #define ZOX_GRAY_TABLE(X)                                                                 \
     X(zoxiRGBToGray_8u_C3C1R, ZOX_GRAY_FIXED, ::zox::gray::Gray8C3)                       \

@@ -25,7 +25,13 @@ using Twist32fP3 = Twist3<float, P3>;
 } // namespace zox::twist
 
 // Every member once, for the kernel instantiations.
-#define ZOX_TWIST_MEMBERS(X) X(::zox::twist::Twist8uC3) X(::zox::twist::Twist8uAC4) X(::zox::twist::Twist8uP3) X(::zox::twist::Twist8sC3) X(::zox::twist::Twist8sAC4) X(::zox::twist::Twist8sP3) X(::zox::twist::Twist16uC3) X(::zox::twist::Twist16uAC4) X(::zox::twist::Twist16uP3) X(::zox::twist::Twist16sC3) X(::zox::twist::Twist16sAC4) X(::zox::twist::Twist16sP3) X(::zox::twist::Twist32fC3) X(::zox::twist::Twist32fAC4) X(::zox::twist::Twist32fP3) X(::zox::twist::Twist4)
+#define ZOX_TWIST_MEMBERS(X) \
+    X(::zox::twist::Twist8uC3) X(::zox::twist::Twist8uAC4) X(::zox::twist::Twist8uP3) \
+    X(::zox::twist::Twist8sC3) X(::zox::twist::Twist8sAC4) X(::zox::twist::Twist8sP3) \
+    X(::zox::twist::Twist16uC3) X(::zox::twist::Twist16uAC4) X(::zox::twist::Twist16uP3) \
+    X(::zox::twist::Twist16sC3) X(::zox::twist::Twist16sAC4) X(::zox::twist::Twist16sP3) \
+    X(::zox::twist::Twist32fC3) X(::zox::twist::Twist32fAC4) X(::zox::twist::Twist32fP3) \
+    X(::zox::twist::Twist4)
 
 #define ZOX_TWIST_TABLE(X) \
     X(zoxiColorTwist32f_8u_C3R, ZOX_TWIST_C, uint8_t, ::zox::twist::Twist8uC3)         \

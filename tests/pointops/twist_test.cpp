@@ -14,8 +14,6 @@ using namespace zox;
 
 namespace {
 
-constexpr bool kPlanar(int planes) { return planes == 3; }
-
 template <class M, class T, class F>
 zoxStatus callTwist(F f, const zt::PointImages& im, ImageSize roi, const float (*t)[4])
 {
@@ -47,7 +45,7 @@ void sweep(F f)
     }
     const twist::Matrix m = twist::matrixOf(t[0], M::rows);
     const int planes = L::planes;
-    const auto side = zt::pointSide<T>(planes, kPlanar(planes) ? 1 : L::stride);
+    const auto side = zt::pointSide<T>(planes, planes == 3 ? 1 : L::stride);
     zt::pointSweep(side, side, inPlace, false, [&](zt::PointImages& im, ImageSize roi, zt::PointRun run, KernelSet k) {
         if (run == zt::PointRun::Export) {
             ASSERT_EQ((callTwist<M, T>(f, im, roi, t)), zoxStatusOk);
