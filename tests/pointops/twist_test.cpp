@@ -149,6 +149,54 @@ TEST(TwistPinned, StreamingRowsGiveTheSameSamples)
         }
 }
 
+// Each in-place member against its out-of-place twin on the same random image (41 x 3, steps padded).
+template <class T, class Out, class In>
+void inPlaceTwin(Out out, In in, int samples) // samples a pixel; 1: three planes
+{
+    const bool planar = samples == 1;
+    const int w = 41, h = 3;
+    zt::Rng rng(9);
+    const int count = planar ? 3 : 1, rowSamples = w * samples + 5, step = rowSamples * static_cast<int>(sizeof(T));
+    std::vector<T> src(static_cast<std::size_t>(rowSamples) * h * count), dst(src.size(), T{}), self;
+    for (T& v : src)
+        v = std::is_floating_point_v<T> ? static_cast<T>(rng() % 512) : static_cast<T>(rng());
+    self = src;
+    const float t[3][4] = {{0.5f, 0.75f, -0.25f, 3}, {1.5f, 0, 0.5f, -7}, {0.25f, 0.25f, 0.25f, 1}};
+    if (planar) {
+        const std::size_t plane = src.size() / 3;
+        const T* s[3] = {src.data(), src.data() + plane, src.data() + 2 * plane};
+        T* d[3] = {dst.data(), dst.data() + plane, dst.data() + 2 * plane};
+        T* io[3] = {self.data(), self.data() + plane, self.data() + 2 * plane};
+        if constexpr (std::is_invocable_v<Out, const T* const*, int, T* const*, int, ImageSize, const float(*)[4]>) {
+            ASSERT_EQ(out(s, step, d, step, {w, h}, t), zoxStatusOk);
+            ASSERT_EQ(in(io, step, {w, h}, t), zoxStatusOk);
+        }
+    } else if constexpr (std::is_invocable_v<Out, const T*, int, T*, int, ImageSize, const float(*)[4]>) {
+        dst = src; // the fourth sample of AC4 is kept on both sides
+        ASSERT_EQ(out(src.data(), step, dst.data(), step, {w, h}, t), zoxStatusOk);
+        ASSERT_EQ(in(self.data(), step, {w, h}, t), zoxStatusOk);
+    }
+    // Row padding is written by neither.
+    for (std::size_t i = 0; i < src.size(); ++i)
+        if (i % rowSamples >= static_cast<std::size_t>(rowSamples - 5))
+            dst[i] = src[i];
+    EXPECT_EQ(std::memcmp(dst.data(), self.data(), dst.size() * sizeof(T)), 0);
+}
+
+TEST(TwistPinned, InPlaceEqualsOutOfPlace)
+{
+    inPlaceTwin<uint8_t>(zoxiColorTwist32f_8u_C3R, zoxiColorTwist32f_8u_C3IR, 3);
+    inPlaceTwin<uint8_t>(zoxiColorTwist32f_8u_AC4R, zoxiColorTwist32f_8u_AC4IR, 4);
+    inPlaceTwin<uint8_t>(zoxiColorTwist32f_8u_P3R, zoxiColorTwist32f_8u_IP3R, 1);
+    inPlaceTwin<int8_t>(zoxiColorTwist32f_8s_C3R, zoxiColorTwist32f_8s_C3IR, 3);
+    inPlaceTwin<int8_t>(zoxiColorTwist32f_8s_P3R, zoxiColorTwist32f_8s_IP3R, 1);
+    inPlaceTwin<uint16_t>(zoxiColorTwist32f_16u_AC4R, zoxiColorTwist32f_16u_AC4IR, 4);
+    inPlaceTwin<int16_t>(zoxiColorTwist32f_16s_C3R, zoxiColorTwist32f_16s_C3IR, 3);
+    inPlaceTwin<float>(zoxiColorTwist_32f_C3R, zoxiColorTwist_32f_C3IR, 3);
+    inPlaceTwin<float>(zoxiColorTwist_32f_AC4R, zoxiColorTwist_32f_AC4IR, 4);
+    inPlaceTwin<float>(zoxiColorTwist_32f_P3R, zoxiColorTwist_32f_IP3R, 1);
+}
+
 TEST(TwistPinned, FourByFour)
 {
     // Channel 3 summed into channel 0; channel 3 transformed by the fourth row.
