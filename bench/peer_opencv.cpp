@@ -11,14 +11,18 @@
 namespace zb {
 namespace {
 
-void registerCvtColor(const std::string& name, int code, const std::string& ours, int type = CV_8UC3)
+// type: the source's; dstType: the destination's where it differs (bytes counted from both).
+void registerCvtColor(const std::string& name, int code, const std::string& ours, int type = CV_8UC3, int dstType = -1)
 {
     const std::size_t sample = type == CV_32FC3 ? 4 : 1;
+    if (dstType < 0)
+        dstType = type;
     for (Size size : kSizes) {
         const std::size_t px = static_cast<std::size_t>(size.width) * size.height;
-        registerPeer("OpenCV " + name, {ours}, size, px * 6 * sample, [code, type, sample](Size s) -> Call {
+        const std::size_t bytes = px * (CV_ELEM_SIZE(type) + CV_ELEM_SIZE(dstType));
+        registerPeer("OpenCV " + name, {ours}, size, bytes, [code, type, dstType, sample](Size s) -> Call {
             auto src = std::make_shared<cv::Mat>(s.height, s.width, type);
-            const std::size_t n = std::size_t(s.width) * s.height * 3;
+            const std::size_t n = std::size_t(s.width) * s.height * CV_ELEM_SIZE(type) / sample;
             const std::vector<uint8_t> bytes = randomBytes(n);
             if (type == CV_32FC3)
                 for (std::size_t i = 0; i < n; ++i)
@@ -26,7 +30,7 @@ void registerCvtColor(const std::string& name, int code, const std::string& ours
             else
                 std::memcpy(src->data, bytes.data(), n * sample);
             // Allocated here with the size and type cvtColor asks for, so the timed call only converts.
-            auto dst = std::make_shared<cv::Mat>(s.height, s.width, type);
+            auto dst = std::make_shared<cv::Mat>(s.height, s.width, dstType);
             return [src, dst, code] { cv::cvtColor(*src, *dst, code); };
         });
     }
@@ -79,6 +83,8 @@ void registerOpenCVPeers()
     registerCvtColor("XYZ2RGB", cv::COLOR_XYZ2RGB, "zoxiXYZToRGB_8u_C3R");
     registerCvtColor("RGB2XYZ 32f", cv::COLOR_RGB2XYZ, "zoxiRGBToXYZ_32f_C3R", CV_32FC3);
     registerCvtColor("XYZ2RGB 32f", cv::COLOR_XYZ2RGB, "zoxiXYZToRGB_32f_C3R", CV_32FC3);
+    registerCvtColor("BGR2BGR565", cv::COLOR_BGR2BGR565, "zoxiBGRToBGR565_8u16u_C3R", CV_8UC3, CV_8UC2);
+    registerCvtColor("BGR5652BGR", cv::COLOR_BGR5652BGR, "zoxiBGR565ToBGR_16u8u_C3R", CV_8UC2, CV_8UC3);
     registerGrayAndTransform();
 }
 } // namespace zb

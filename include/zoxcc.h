@@ -398,6 +398,35 @@ ZOXCC_API zoxStatus zoxiGammaInv_32f_AC4IR(float* srcDst, int srcDstStep, ImageS
 ZOXCC_API zoxStatus zoxiGammaInv_32f_P3R(const float* const src[3], int srcStep, float* const dst[3], int dstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
 ZOXCC_API zoxStatus zoxiGammaInv_32f_IP3R(float* const srcDst[3], int srcDstStep, ImageSize roiSize, float rangeLow, float rangeHigh);
 
+/* ---- Sixteen-bit RGB words, 16u <-> 8u, full resolution ----------------------------------------------
+ * Words hold three fields from bit 0: low, middle, high. 565: 5, 6, 5 bits; 555: 5, 5, 5 (bit 15 written
+ * 0, ignored when read); 444: 4, 4, 4 (bits 12..15 written 0). BGR words put blue in the low field, RGB
+ * words red. Fields grow to 8 bits by a bare left shift (31 gives 248) and shrink by a truncating right
+ * shift. Words <-> 8-bit pixels: byte 0 of the pixel is the low field in both the BGR and the RGB
+ * member. Y, Cb, Cr bytes (studio range) to words: block colour, a = mulHigh((Y - 16) << 7, 9535),
+ * R = clip8((a + mulHigh(v << 7, 13074)) >> 4), G = clip8((a - mulHigh(v << 7, 6660) - mulHigh(u << 7,
+ * 3211)) >> 4), B = clip8((a + mulHigh(u << 7, 16523)) >> 4) with u = Cb - 128, v = Cr - 128; C3R pixels
+ * from column w & ~7 on take pixel colour, a = 76284 (Y - 16), R = clip8((a + 104595 v) >> 16),
+ * G = clip8((a - 25690 u - 53281 v) >> 16), B = clip8((a + 132186 u) >> 16); P3C3R planes take block
+ * colour everywhere. Steps of word images are taken in whole words (21 gives 20, -21 gives -22).
+ * Checks: src and dst, then a size below 1 (zoxStatusBadSize), then each plane. */
+ZOXCC_API zoxStatus zoxiBGR565ToBGR_16u8u_C3R(const uint16_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGB565ToRGB_16u8u_C3R(const uint16_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGRToBGR565_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGBToRGB565_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR444_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR555_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR565_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB444_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB555_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB565_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR444_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR555_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR565_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB444_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB555_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB565_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+
 /* ---- Colour twist, 8u / 8s / 16u / 16s / 32f ---------------------------------------------------------
  * An affine map of the three colour channels: output channel i is a sum of the three inputs times
  * twist[i][0..2] plus the offset twist[i][3] (in sample units), in single precision with each step

@@ -248,7 +248,12 @@ void putPx(const typename L::Row& row, int x, int c0, int c1, int c2, int extra)
     using T = typename L::Sample;
     constexpr int z = sizeof(T);
     const int c[3] = {c0, c1, c2};
-    if constexpr (L::planes == 1) {
+    if constexpr (requires { typename L::Fields; }) { // a word: each channel's top bits in its field
+        using F = typename L::Fields;
+        const int w = (c0 & 255) >> (8 - F::low) | ((c1 & 255) >> (8 - F::mid)) << F::low |
+                      ((c2 & 255) >> (8 - F::high)) << (F::low + F::mid);
+        zox::storeSample<T>(const_cast<uint8_t*>(row.p[0]) + static_cast<std::size_t>(x) * 2, w);
+    } else if constexpr (L::planes == 1) {
         uint8_t* q = const_cast<uint8_t*>(row.p[0]) + static_cast<std::size_t>(x) * L::bytesPerPixel;
         for (int k = 0; k < 3; ++k)
             zox::storeSample<T>(q + z * zox::channelByte(L::order, k), c[k]);
