@@ -74,14 +74,12 @@ namespace words {
 
 // Samples as they come: words to bytes and bytes to words.
 struct Copy {
-    static constexpr bool compilerVectorised = true;
     static Px apply(const Px& p) { return p; }
 };
 
 // Y, Cb, Cr to R, G, B at studio range, in 16-bit lanes: a = mulHigh((Y - 16) << 7, 9535), each
 // channel a plus its chroma terms, shifted right by 4.
 struct BlockColour {
-    static constexpr bool compilerVectorised = true;
     static Px apply(const Px& p)
     {
         const int a = mulHigh((p.c[0] - 16) << 7, 9535), u = (p.c[1] - 128) << 7, v = (p.c[2] - 128) << 7;

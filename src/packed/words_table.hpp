@@ -21,21 +21,21 @@ using OutWord565Low2 = OutWord<Fields565, 2>;
 
 // The rows with kernels of their own, and the twins that share a row's kernels (same layouts and forms).
 #define ZOX_WORDS_OWN(X) \
-    X(zoxiBGR565ToBGR_16u8u_C3R, ZOX_SHAPE_SD_SAMPLES, InWord565, OutC3, 1, NoBlock, words::Copy, PlanesLast)                          \
-    X(zoxiBGRToBGR565_8u16u_C3R, ZOX_SHAPE_SD_SAMPLES, InC3, OutWord565Low0, 1, NoBlock, words::Copy, PlanesLast)                      \
+    X(zoxiBGR565ToBGR_16u8u_C3R, ZOX_SHAPE_SD_SAMPLES, InWord565, OutC3, 8, words::Copy, words::Copy, PlanesLast)                          \
+    X(zoxiBGRToBGR565_8u16u_C3R, ZOX_SHAPE_SD_SAMPLES, InC3, OutWord565Low0, 8, words::Copy, words::Copy, PlanesLast)                      \
     X(zoxiYCbCrToBGR444_8u16u_C3R, ZOX_SHAPE_SD_SAMPLES, InC3, OutWord444Low2, 8, words::BlockColour, words::PixelColour, PlanesLast)  \
     X(zoxiYCbCrToBGR555_8u16u_C3R, ZOX_SHAPE_SD_SAMPLES, InC3, OutWord555Low2, 8, words::BlockColour, words::PixelColour, PlanesLast)  \
     X(zoxiYCbCrToBGR565_8u16u_C3R, ZOX_SHAPE_SD_SAMPLES, InC3, OutWord565Low2, 8, words::BlockColour, words::PixelColour, PlanesLast)  \
     X(zoxiYCbCrToRGB444_8u16u_C3R, ZOX_SHAPE_SD_SAMPLES, InC3, OutWord444Low0, 8, words::BlockColour, words::PixelColour, PlanesLast)  \
     X(zoxiYCbCrToRGB555_8u16u_C3R, ZOX_SHAPE_SD_SAMPLES, InC3, OutWord555Low0, 8, words::BlockColour, words::PixelColour, PlanesLast)  \
     X(zoxiYCbCrToRGB565_8u16u_C3R, ZOX_SHAPE_SD_SAMPLES, InC3, OutWord565Low0, 8, words::BlockColour, words::PixelColour, PlanesLast)  \
-    X(zoxiYCbCrToBGR444_8u16u_P3C3R, ZOX_SHAPE_SD_SAMPLES, InP3, OutWord444Low2, 1, NoBlock, words::BlockColour, PlanesLast)           \
-    X(zoxiYCbCrToBGR555_8u16u_P3C3R, ZOX_SHAPE_SD_SAMPLES, InP3, OutWord555Low2, 1, NoBlock, words::BlockColour, PlanesLast)           \
-    X(zoxiYCbCrToBGR565_8u16u_P3C3R, ZOX_SHAPE_SD_SAMPLES, InP3, OutWord565Low2, 1, NoBlock, words::BlockColour, PlanesLast)           \
-    X(zoxiYCbCrToRGB444_8u16u_P3C3R, ZOX_SHAPE_SD_SAMPLES, InP3, OutWord444Low0, 1, NoBlock, words::BlockColour, PlanesLast)           \
-    X(zoxiYCbCrToRGB555_8u16u_P3C3R, ZOX_SHAPE_SD_SAMPLES, InP3, OutWord555Low0, 1, NoBlock, words::BlockColour, PlanesLast)           \
-    X(zoxiYCbCrToRGB565_8u16u_P3C3R, ZOX_SHAPE_SD_SAMPLES, InP3, OutWord565Low0, 1, NoBlock, words::BlockColour, PlanesLast)
+    X(zoxiYCbCrToBGR444_8u16u_P3C3R, ZOX_SHAPE_SD_SAMPLES, InP3, OutWord444Low2, 8, words::BlockColour, words::BlockColour, PlanesLast)           \
+    X(zoxiYCbCrToBGR555_8u16u_P3C3R, ZOX_SHAPE_SD_SAMPLES, InP3, OutWord555Low2, 8, words::BlockColour, words::BlockColour, PlanesLast)           \
+    X(zoxiYCbCrToBGR565_8u16u_P3C3R, ZOX_SHAPE_SD_SAMPLES, InP3, OutWord565Low2, 8, words::BlockColour, words::BlockColour, PlanesLast)           \
+    X(zoxiYCbCrToRGB444_8u16u_P3C3R, ZOX_SHAPE_SD_SAMPLES, InP3, OutWord444Low0, 8, words::BlockColour, words::BlockColour, PlanesLast)           \
+    X(zoxiYCbCrToRGB555_8u16u_P3C3R, ZOX_SHAPE_SD_SAMPLES, InP3, OutWord555Low0, 8, words::BlockColour, words::BlockColour, PlanesLast)           \
+    X(zoxiYCbCrToRGB565_8u16u_P3C3R, ZOX_SHAPE_SD_SAMPLES, InP3, OutWord565Low0, 8, words::BlockColour, words::BlockColour, PlanesLast)
 #define ZOX_WORDS_TWINS(X) \
-    X(zoxiRGB565ToRGB_16u8u_C3R, ZOX_SHAPE_SD_SAMPLES, InWord565, OutC3, 1, NoBlock, words::Copy, PlanesLast)      \
-    X(zoxiRGBToRGB565_8u16u_C3R, ZOX_SHAPE_SD_SAMPLES, InC3, OutWord565Low0, 1, NoBlock, words::Copy, PlanesLast)
+    X(zoxiRGB565ToRGB_16u8u_C3R, ZOX_SHAPE_SD_SAMPLES, InWord565, OutC3, 8, words::Copy, words::Copy, PlanesLast)      \
+    X(zoxiRGBToRGB565_8u16u_C3R, ZOX_SHAPE_SD_SAMPLES, InC3, OutWord565Low0, 8, words::Copy, words::Copy, PlanesLast)
 #define ZOX_WORDS_TABLE(X) ZOX_WORDS_OWN(X) ZOX_WORDS_TWINS(X)

@@ -1,0 +1,49 @@
+// Readers and writers of word images for the generic block kernels, written once against the vector
+// vocabulary and included inside the namespace of each instruction set (and, for AVX2, of its 128-bit
+// half). Words travel as 16-bit lanes: a group of sixteen a lane, a = words 0..7, b = 8..15.
+
+template <class F>
+struct WordLanes {
+    // The three fields of eight words, each at the top of the low byte of its lane (bare shift).
+    static V3 fields(V w)
+    {
+        V3 v;
+        v.c[0] = shl<8 - F::low>(and_(w, splat16((1 << F::low) - 1)));
+        v.c[1] = shl<8 - F::mid>(and_(shrU<F::low>(w), splat16((1 << F::mid) - 1)));
+        v.c[2] = shl<8 - F::high>(and_(shrU<F::low + F::mid>(w), splat16((1 << F::high) - 1)));
+        v.extra = zero();
+        return v;
+    }
+    // Eight words from channels limited to 0..255 and reduced by truncating shifts.
+    template <int LowChannel>
+    static V word(const V3& v)
+    {
+        auto clip = [](V x) { return max16(min16(x, splat16(255)), zero()); };
+        const V lo = shrU<8 - F::low>(clip(v.c[LowChannel]));
+        const V mid = shrU<8 - F::mid>(clip(v.c[1]));
+        const V hi = shrU<8 - F::high>(clip(v.c[2 - LowChannel]));
+        return or_(or_(lo, shl<F::low>(mid)), shl<F::low + F::mid>(hi));
+    }
+};
+
+template <class F>
+struct GroupIo<InWord<F>> {
+    template <int Shift>
+    static void get(const typename InWord<F>::Row& row, int x, V3& a, V3& b)
+    {
+        static_assert(Shift == 0, "words fill the low byte of their lanes");
+        const uint8_t* q = row.p[0] + 2 * static_cast<std::size_t>(x);
+        a = WordLanes<F>::fields(loadLanes(q, 32));
+        b = WordLanes<F>::fields(loadLanes(q + 16, 32));
+    }
+};
+
+template <class F, int LowChannel>
+struct GroupIo<OutWord<F, LowChannel>> {
+    static void put(const typename OutWord<F, LowChannel>::Row& row, int x, const V3& a, const V3& b, const Ctx&)
+    {
+        uint8_t* q = row.p[0] + 2 * static_cast<std::size_t>(x);
+        storeLanes(q, 32, WordLanes<F>::template word<LowChannel>(a));
+        storeLanes(q + 16, 32, WordLanes<F>::template word<LowChannel>(b));
+    }
+};

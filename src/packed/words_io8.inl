@@ -1,0 +1,19 @@
+// Eight words at a time, for the shorter groups of the 128-bit block kernels (after conv128.inl).
+
+template <class F>
+struct Io8<InWord<F>> {
+    template <int Shift>
+    static V3 get(const typename InWord<F>::Row& row, int x)
+    {
+        static_assert(Shift == 0, "words fill the low byte of their lanes");
+        return WordLanes<F>::fields(load16(row.p[0] + 2 * static_cast<std::size_t>(x)));
+    }
+};
+
+template <class F, int LowChannel>
+struct Io8<OutWord<F, LowChannel>> {
+    static void put(const typename OutWord<F, LowChannel>::Row& row, int x, const V3& v, const Ctx&)
+    {
+        store16(row.p[0] + 2 * static_cast<std::size_t>(x), WordLanes<F>::template word<LowChannel>(v));
+    }
+};
