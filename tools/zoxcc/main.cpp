@@ -12,14 +12,15 @@
 
 namespace {
 
-int usage()
+// The usage text, on stdout when asked for (exit 0), else on stderr (exit 2).
+int usage(bool asked = false)
 {
-    std::fprintf(stderr, "usage: zoxcc version | list | demo [DIR]\n"
+    std::fprintf(asked ? stdout : stderr, "usage: zoxcc version | list | demo [DIR]\n"
                          "  version     the library's version record\n"
                          "  list        the exported conversions, one a line\n"
                          "  demo [DIR]  converts a built-in test picture and writes the results as\n"
                          "              PPM/PGM files into DIR (default ./zoxcc-demo), with timings\n");
-    return 2;
+    return asked ? 0 : 2;
 }
 
 int version()
@@ -62,11 +63,14 @@ int main(int argc, char** argv)
     if (argc < 2)
         return usage();
     const std::string cmd = argv[1];
+    if (cmd == "help" || cmd == "-h" || cmd == "--help")
+        return usage(true);
     if (cmd == "version" && argc == 2)
         return version();
     if (cmd == "list" && argc == 2)
         return list();
-    if (cmd == "demo" && argc <= 3)
+    // A folder name never starts with '-': that is an option this tool does not have.
+    if (cmd == "demo" && (argc == 2 || (argc == 3 && argv[2][0] != '-')))
         return demo(argc == 3 ? argv[2] : "zoxcc-demo");
     return usage();
 }
