@@ -427,6 +427,94 @@ ZOXCC_API zoxStatus zoxiYCbCrToRGB444_8u16u_P3C3R(const uint8_t* const src[3], i
 ZOXCC_API zoxStatus zoxiYCbCrToRGB555_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
 ZOXCC_API zoxStatus zoxiYCbCrToRGB565_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
 
+/* ---- Sixteen-bit RGB words from chroma-sampled images --------------------------------------------------
+ * Y, Cb, Cr at studio range (or Y, U, V) to the words above. Chroma: packed 4:2:2 (Y0 Cb Y1 Cr, 2w bytes a
+ * row) and 4:2:2 planes ((w + 1) / 2 samples a row) serve columns 2i, 2i + 1 from sample i; 4:2:0 planes
+ * ((w + 1) / 2 samples, (h + 1) / 2 rows) serve 2x2 blocks; 4:1:1 planes (w / 4 samples) serve 4i..4i + 3.
+ * Forms (u = Cb - 128, v = Cr - 128): block colour as above, rounded block colour with 8 added before each
+ * shift by 4; pixel colour as above, rounded with 0x8000 added; folded colour R = clip8((76284 Y +
+ * 104595 Cr - 14608761) >> 16), G = clip8((76284 Y - 25690 Cb - 53281 Cr + 8887730) >> 16),
+ * B = clip8((76284 Y + 132186 Cb - 18140365) >> 16); YUV block colour R = clip8(((Y << 4) + mulHigh(v << 7,
+ * 9338)) >> 4), G = clip8(((Y << 4) - mulHigh(v << 7, 4759) - mulHigh(u << 7, 3227)) >> 4), B = clip8(((Y <<
+ * 4) + mulHigh(u << 7, 16646)) >> 4); YUV pixel colour R = clip8(((Y << 16) + 74711 v) >> 16), G =
+ * clip8(((Y << 16) - 25821 u - 38076 v) >> 16), B = clip8(((Y << 16) + 133169 u) >> 16).
+ * Odd sizes: packed 4:2:2 takes block colour below w & ~7 and folded colour up to w & ~1; a last odd
+ * column takes pixel colour with its own Cb and the Cr just ahead of its Y, and a region one pixel wide
+ * folded colour with its one chroma byte as both. 4:2:2 planes: block colour; width 1 writes nothing.
+ * 4:2:0 planes: block colour everywhere, a last odd column and row included. 4:1:1: rounded block colour
+ * below w & ~3, rounded pixel colour for the last w & 3 columns on sample w / 4 - 1; zoxWarnOddSize when
+ * w & 3. YUV 4:2:0: YUV block colour, a last odd column and row YUV pixel colour; width or height 1 writes
+ * nothing. Checks: src and dst, then a size below 1 (below 4 wide for 4:1:1, whose planes are checked
+ * before the size), then each plane.
+ * Dither members: block colour (YUV block colour for YUV sources) in every pixel, edges included, then for
+ * each channel c with n = 2^bits - 1, q = (n c) >> 8, e = (c << 8) - s q (s = 4352, 2105 or 1036 for 4-,
+ * 5- and 6-bit fields) and the field q + 1 where e is above the tile threshold t, else q. The 4x4 tile
+ * starts at the region's first pixel; its ranks 0 8 2 10 / 12 4 14 6 / 3 11 1 9 / 15 7 13 5 give t = 289 k
+ * for 4-bit fields and floor(17 k 255 / 31) for 5-bit ones, halved for the 6-bit field. A packed 4:2:2
+ * last odd column and width 1 take the one chroma byte as both Cb and Cr. No member warns. */
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR444_8u16u_C2C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR555_8u16u_C2C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR565_8u16u_C2C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB444_8u16u_C2C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB555_8u16u_C2C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB565_8u16u_C2C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR444_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR555_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR565_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB444_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB555_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB565_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToBGR444_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToBGR555_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToBGR565_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToRGB444_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToRGB555_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToRGB565_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToBGR555_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr411ToBGR565_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToBGR444_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToBGR555_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToBGR565_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToRGB444_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToRGB555_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToRGB565_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR444Dither_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR555Dither_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR565Dither_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB444Dither_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB555Dither_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB565Dither_8u16u_C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR444Dither_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR555Dither_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToBGR565Dither_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB444Dither_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB555Dither_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCrToRGB565Dither_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR444Dither_8u16u_C2C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR555Dither_8u16u_C2C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR565Dither_8u16u_C2C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB444Dither_8u16u_C2C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB555Dither_8u16u_C2C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB565Dither_8u16u_C2C3R(const uint8_t* src, int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR444Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR555Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToBGR565Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB444Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB555Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr422ToRGB565Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToBGR444Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToBGR555Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToBGR565Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToRGB444Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToRGB555Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYCbCr420ToRGB565Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToBGR444Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToBGR555Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToBGR565Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToRGB444Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToRGB555Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiYUV420ToRGB565Dither_8u16u_P3C3R(const uint8_t* const src[3], const int srcStep[3], uint16_t* dst, int dstStep, ImageSize roiSize);
+
 /* ---- Colour twist, 8u / 8s / 16u / 16s / 32f ---------------------------------------------------------
  * An affine map of the three colour channels: output channel i is a sum of the three inputs times
  * twist[i][0..2] plus the offset twist[i][3] (in sample units), in single precision with each step

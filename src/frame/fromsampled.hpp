@@ -3,9 +3,10 @@
 // pass walk and validating layer that all such exports share.
 //
 // Column rule: pixels before the row's limit column take the block form, the others the remainder form.
-// A 4:2:0 image goes by row pairs and whole units: a last odd row or column is not written. In 4:2:2 the
-// pixel of an odd width's half unit takes the member's last-pixel form; in 4:1:1 the pixels behind the
-// last whole unit take that unit's chroma. Each form is defined once, in scalar code; a SIMD kernel is a
+// A 4:2:0 image goes by row pairs and whole units; a last odd column (both rows of each pair) and a last
+// odd row take the member's edge form with the chroma sample they fall on, or are not written. In 4:2:2
+// the pixel of an odd width's half unit takes the member's last-pixel form; in 4:1:1 the pixels behind
+// the last whole unit take that unit's chroma. Each form is defined once, in scalar code; a SIMD kernel is a
 // checked fast path of it over a prefix of the units.
 #pragma once
 
@@ -105,13 +106,14 @@ struct InSampledC2 {
     }
 };
 
-// The form of an odd 4:2:2 width's last pixel (Odd), and of the one pixel of width 1 (Single).
+// The form of an odd 4:2:2 width's last pixel (Odd), and of the one pixel of width 1 (Single). In 4:2:0
+// the edge form of a last odd column and row (Odd), and of a region one pixel wide or high (Single).
 template <class Odd_, class Single_ = Odd_>
 struct LastPixel {
     using Odd = Odd_;
     using Single = Single_;
 };
-// The last pixel of an odd width is not written.
+// The last pixel of an odd width is not written (as a form of LastPixel: those pixels are not written).
 struct Unwritten {};
 
 template <class Src_, class Dst_, Limit L_, class Block_, class Rem_, class Last_, int Variant_ = 0>
@@ -137,6 +139,14 @@ template <class C, class Form>
 inline void storePixel(const SampledRows& s, const PixelRows<typename C::Dst>& d, int dy, int x, ChromaPair ch, const Ctx& ctx)
 {
     C::Dst::store(d.r[dy], x, Form::apply(Px{{C::Src::luma(s, dy, x), ch.cb, ch.cr}, 0}), ctx);
+}
+
+// A pixel of an odd size's edge, unless its form says it is not written.
+template <class C, class Form>
+inline void storeEdgePixel(const SampledRows& s, const PixelRows<typename C::Dst>& d, int dy, int x, ChromaPair ch, const Ctx& ctx)
+{
+    if constexpr (!std::is_same_v<Form, Unwritten>)
+        storePixel<C, Form>(s, d, dy, x, ch, ctx);
 }
 
 // A form over units [from, to): the oracle of the SIMD kernels.
@@ -206,9 +216,36 @@ void convertPixelPass(const SampledRows& s, const PixelRows<typename C::Dst>& d,
         if (width & 1) {
             const ChromaPair ch = C::Src::halfUnit(s, units, width == 1);
             if (width == 1)
-                storePixel<C, typename LastOf<typename C::Last>::Single>(s, d, 0, 0, ch, ctx);
+                storeEdgePixel<C, typename LastOf<typename C::Last>::Single>(s, d, 0, 0, ch, ctx);
             else
-                storePixel<C, typename LastOf<typename C::Last>::Odd>(s, d, 0, width - 1, ch, ctx);
+                storeEdgePixel<C, typename LastOf<typename C::Last>::Odd>(s, d, 0, width - 1, ch, ctx);
+        }
+    }
+}
+
+// The edges of a 4:2:0 image in the edge form: a last odd column in every row pair, then a last odd row
+// (its corner included), each pixel with the chroma sample it falls on.
+template <class C, class Form>
+void convertEdges420(const SampledImage& src, typename C::Dst::Arg dst, std::ptrdiff_t dstStep, ImageSize roi, const Ctx& ctx)
+{
+    if constexpr (!std::is_same_v<Form, Unwritten>) {
+        const int passes = roi.height / 2, last = roi.width - 1;
+        for (int j = 0; (roi.width & 1) && j < passes; ++j) {
+            const SampledRows s = C::Src::pass(src, j);
+            PixelRows<typename C::Dst> d;
+            d.r[0] = C::Dst::row(dst, dstStep, 2 * j);
+            d.r[1] = C::Dst::row(dst, dstStep, 2 * j + 1);
+            const ChromaPair ch = C::Src::chroma(s, last >> 1);
+            storePixel<C, Form>(s, d, 0, last, ch, ctx);
+            storePixel<C, Form>(s, d, 1, last, ch, ctx);
+        }
+        if (roi.height & 1) {
+            SampledRows s = C::Src::pass(src, passes);
+            s.y[1] = s.y[0];
+            PixelRows<typename C::Dst> d;
+            d.r[0] = d.r[1] = C::Dst::row(dst, dstStep, roi.height - 1);
+            for (int x = 0; x < roi.width; ++x)
+                storePixel<C, Form>(s, d, 0, x, C::Src::chroma(s, x >> 1), ctx);
         }
     }
 }
@@ -222,6 +259,13 @@ void convertPixelPasses(const SampledImage& src, typename C::Dst::Arg dst, std::
         d.r[0] = C::Dst::row(dst, dstStep, C::uh * j);
         d.r[1] = C::Dst::row(dst, dstStep, C::uh * j + C::uh - 1);
         convertPixelPass<C, K>(C::Src::pass(src, j), d, roi.width, ctx);
+    }
+    if constexpr (C::sampling == Sampling::S420 && !std::is_same_v<typename C::Last, Unwritten>) {
+        using L = LastOf<typename C::Last>;
+        if (roi.width == 1 || roi.height == 1)
+            convertEdges420<C, typename L::Single>(src, dst, dstStep, roi, ctx);
+        else
+            convertEdges420<C, typename L::Odd>(src, dst, dstStep, roi, ctx);
     }
 }
 
@@ -310,7 +354,7 @@ zoxStatus fromPlanes3(const uint8_t* const* src, const int* srcStep, typename Ro
 {
     using C = typename Row::Other;
     return checkedSampled<R>(src && srcStep && dst, [&] { return src[0] && src[1] && src[2] && C::Dst::planesValid(dst); }, roi,
-                             [&] { runFromSampled<Row>(C::Src::image(src, srcStep), dst, dstStep, roi, ctx); });
+                             [&] { runFromSampled<Row>(C::Src::image(src, srcStep), dst, wholeSampleStep<typename C::Dst>(dstStep), roi, ctx); });
 }
 
 // srcY, srcYStep, srcCbCr, srcCbCrStep, dst, dstStep; or one plane of groups (second pointer null)
@@ -321,7 +365,7 @@ zoxStatus fromPlanes(const uint8_t* p0, int step0, const uint8_t* p1, int step1,
     using C = typename Row::Other;
     constexpr bool two = C::Src::planes == 2;
     return checkedSampled<R>(p0 && (!two || p1) && dst, [&] { return C::Dst::planesValid(dst); }, roi, [&] {
-        runFromSampled<Row>(SampledImage{{p0, p1, nullptr}, {step0, step1, 0}}, dst, dstStep, roi, ctx);
+        runFromSampled<Row>(SampledImage{{p0, p1, nullptr}, {step0, step1, 0}}, dst, wholeSampleStep<typename C::Dst>(dstStep), roi, ctx);
     });
 }
 

@@ -17,6 +17,12 @@ struct InverseSimd<RgbFromYccBlock<K, Rd, G>> {
     }
 };
 
+// The same on whole pixels.
+template <const YccInverseGains& K, Rounding Rd, Green G>
+struct Simd<RgbFromYccBlock<K, Rd, G>> {
+    static void apply(V3& v) { applyInverse<RgbFromYccBlock<K, Rd, G>>(v); }
+};
+
 template <const YuvInverseGains& K>
 struct InverseSimd<RgbFromYuvBlock16With<K>> {
     static constexpr int shift = 1;

@@ -43,11 +43,6 @@ struct Simd<YccFromRgbRound> {
     }
 };
 
-template <const YccInverseGains& K, Rounding Rd, Green G>
-struct Simd<RgbFromYccBlock<K, Rd, G>> {
-    static void apply(V3& v) { applyInverse<RgbFromYccBlock<K, Rd, G>>(v); }
-};
-
 // ---- whole-row forms over 32-bit lanes ----------------------------------------------------------------
 
 template <>

@@ -10,6 +10,7 @@ namespace zox::avx2::half {
 
 namespace zox::avx2 {
 #include "packed/words_io.inl"
+#include "lumachroma/inverse_simd.inl"
 #include "packed/words_simd.inl"
 
 ZOX_WORDS_OWN(ZOX_INSTANTIATE_KERNELS)

@@ -4,6 +4,8 @@
 
 #include "frame/layouts.hpp"
 #include "frame/ops.hpp"
+#include "lumachroma/ycbcr_forms.hpp"
+#include "sampling/fromsampled_forms.hpp"
 
 #include <cstdint>
 #include <cstring>
@@ -77,27 +79,103 @@ struct Copy {
     static Px apply(const Px& p) { return p; }
 };
 
-// Y, Cb, Cr to R, G, B at studio range, in 16-bit lanes: a = mulHigh((Y - 16) << 7, 9535), each
-// channel a plus its chroma terms, shifted right by 4.
-struct BlockColour {
-    static Px apply(const Px& p)
-    {
-        const int a = mulHigh((p.c[0] - 16) << 7, 9535), u = (p.c[1] - 128) << 7, v = (p.c[2] - 128) << 7;
-        return {{clip8((a + mulHigh(v, 13074)) >> 4), clip8((a - mulHigh(v, 6660) - mulHigh(u, 3211)) >> 4),
-                 clip8((a + mulHigh(u, 16523)) >> 4)},
-                0};
-    }
-};
+// Y, Cb, Cr to R, G, B at studio range. Block colour in 16-bit lanes: a = mulHigh((Y - 16) << 7, 9535),
+// each channel a plus its chroma terms, shifted right by 4 (rounded: 8 added first). Pixel colour in 32
+// bits: a = 76284 (Y - 16), each channel (a + terms) >> 16 (rounded: 0x8000 added first). Folded colour:
+// the pixel gains on the raw samples with the offsets in one constant a channel.
+using BlockColour = RgbFromYccBlock<YccInverseBlockB, Rounding::Truncated, Green::Difference>;
+using RoundedBlockColour = RgbFromYccBlock<YccInverseBlockB, Rounding::Rounded, Green::Difference>;
+using PixelColour = RgbFromYccPixelATruncated;
+using RoundedPixelColour = RgbFromYccPixelARounded;
+using FoldedColour = RgbFromYccBiased;
+// Y, U, V to R, G, B: 16 Y and chroma at 128 x into multiply-highs over 16, no rounding term; the pixel
+// form the rounded whole-sample gains, truncated.
+using YuvBlockColour = RgbFromWide<YuvInverseBlockMixed, Green::Difference, 0>;
+using YuvPixelColour = RgbFromYuvPixel<YuvInverseRounded, 0, 0>;
 
-// The same in 32 bits: a = 76284 (Y - 16), each channel (a + terms) >> 16.
-struct PixelColour {
-    static constexpr bool compilerVectorised = true;
-    static Px apply(const Px& p)
-    {
-        const int a = 76284 * (p.c[0] - 16), u = p.c[1] - 128, v = p.c[2] - 128;
-        return {{clip8((a + 104595 * v) >> 16), clip8((a - 25690 * u - 53281 * v) >> 16), clip8((a + 132186 * u) >> 16)}, 0};
-    }
+// A form fed with the one chroma byte of a half group as both Cb and Cr.
+template <class Form>
+struct CbAsCr {
+    static Px apply(const Px& p) { return Form::apply(Px{{p.c[0], p.c[1], p.c[1]}, p.extra}); }
 };
 
 } // namespace words
+
+// The ordered dither of word destinations: a 4 by 4 tile of thresholds anchored at the region's first
+// pixel, one rank pattern in two scalings (289 k for 4-bit fields, floor(17 k 255 / 31) for 5- and 6-bit
+// ones, the 6-bit field halving the entry). A channel c of 0..255 with n = 2^bits - 1 gives
+// q = (n c) >> 8 and e = (c << 8) - s q, and the field q + 1 where e is above the threshold, else q.
+namespace dither {
+
+inline constexpr int kRank[4][4] = {{0, 8, 2, 10}, {12, 4, 14, 6}, {3, 11, 1, 9}, {15, 7, 13, 5}};
+
+// For each tile row, the thresholds of eight consecutive columns starting at column r (0..3) of the tile:
+// [row][r][i] is the entry at column (r + i) & 3. Rotation 0 serves single pixels, all four the lanes.
+struct Tile {
+    uint16_t lanes[4][4][8];
+};
+constexpr Tile tileOf(int fieldBits)
+{
+    Tile t{};
+    for (int y = 0; y < 4; ++y)
+        for (int r = 0; r < 4; ++r)
+            for (int i = 0; i < 8; ++i) {
+                const int k = kRank[y][(r + i) & 3];
+                t.lanes[y][r][i] = static_cast<uint16_t>(fieldBits == 4 ? 289 * k : 17 * k * 255 / 31);
+            }
+    return t;
+}
+inline constexpr Tile kTile4 = tileOf(4);
+inline constexpr Tile kTile5 = tileOf(5);
+
+// The quantiser of one field width: levels factor n, step s, and the threshold taken as the 5-bit entry
+// halved for 6-bit fields.
+template <int Bits>
+struct Channel {
+    static constexpr int n = (1 << Bits) - 1;
+    static constexpr int s = Bits == 4 ? 4352 : Bits == 5 ? 2105 : 1036;
+    static constexpr int thresholdShift = Bits == 6 ? 1 : 0;
+    static_assert(Bits >= 4 && Bits <= 6);
+    static int apply(int c, int entry)
+    {
+        const int q = (n * c) >> 8, e = (c << 8) - s * q;
+        return q + (e > (entry >> thresholdShift) ? 1 : 0);
+    }
+};
+
+} // namespace dither
+
+// A destination of dithered words: OutWord's fields, each quantised against the tile entry of the pixel's
+// column and row in the region. A row knows its tile row.
+template <class F, int LowChannel>
+struct OutDitherWord {
+    using Fields = F;
+    using Pixel = Px;
+    static constexpr int planes = 1;
+    static constexpr int bytesPerPixel = 2;
+    static constexpr int lowChannel = LowChannel;
+    using Sample = uint16_t;
+    using Arg = uint16_t*;
+    static_assert(F::low == F::high && F::low <= F::mid);
+    static constexpr const dither::Tile& tile = F::low == 4 ? dither::kTile4 : dither::kTile5;
+    struct Row {
+        uint8_t* p[1];
+        const uint16_t (*lanes)[8]; // the tile row's four rotations
+    };
+    static constexpr bool planesValid(Arg) { return true; }
+    static Row row(Arg a, std::ptrdiff_t step, int r)
+    {
+        return {{rowAddress(reinterpret_cast<uint8_t*>(a), step, r)}, tile.lanes[r & 3]};
+    }
+    static void store(const Row& row, int x, const Pixel& px, const Ctx&)
+    {
+        const int t = row.lanes[0][x & 3];
+        const int lo = dither::Channel<F::low>::apply(px.c[LowChannel], t);
+        const int mid = dither::Channel<F::mid>::apply(px.c[1], t);
+        const int hi = dither::Channel<F::high>::apply(px.c[2 - LowChannel], t);
+        const auto w = static_cast<uint16_t>(lo | mid << F::low | hi << (F::low + F::mid));
+        std::memcpy(row.p[0] + 2 * static_cast<std::size_t>(x), &w, 2);
+    }
+};
+
 } // namespace zox

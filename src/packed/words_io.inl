@@ -24,7 +24,37 @@ struct WordLanes {
         const V hi = shrU<8 - F::high>(clip(v.c[2 - LowChannel]));
         return or_(or_(lo, shl<F::low>(mid)), shl<F::low + F::mid>(hi));
     }
+    // One channel quantised against the thresholds t: q = (n c) >> 8, e = (c << 8) - s q (both exact in
+    // unsigned 16-bit lanes), and q + 1 where e is above the threshold. The saturating difference e - t is
+    // 0 exactly where e is not above it; the all-ones compare then takes the 1 back.
+    template <int Bits>
+    static V quantised(V c, V t)
+    {
+        using Ch = dither::Channel<Bits>;
+        const V q = shrU<8>(mulLo(c, splat16(Ch::n)));
+        const V e = sub(shl<8>(c), mulLo(q, splat16(Ch::s)));
+        const V th = Ch::thresholdShift ? shrU<1>(t) : t;
+        return add(add(q, splat16(1)), cmpEq16(subSatU(e, th), zero()));
+    }
+    // Eight dithered words, channels limited to 0..255 first.
+    template <int LowChannel>
+    static V ditheredWord(const V3& v, V t)
+    {
+        auto clip = [](V x) { return max16(min16(x, splat16(255)), zero()); };
+        const V lo = quantised<F::low>(clip(v.c[LowChannel]), t);
+        const V mid = quantised<F::mid>(clip(v.c[1]), t);
+        const V hi = quantised<F::high>(clip(v.c[2 - LowChannel]), t);
+        return or_(or_(lo, shl<F::low>(mid)), shl<F::low + F::mid>(hi));
+    }
 };
+
+// The thresholds of the eight columns from x, for every group of a row: groups start a multiple of 8
+// columns apart, so one rotation of the tile row serves all lanes.
+template <class L>
+inline V ditherLanes(const typename L::Row& row, int x)
+{
+    return loadLanes(reinterpret_cast<const uint8_t*>(row.lanes[x & 3]), 0);
+}
 
 template <class F>
 struct GroupIo<InWord<F>> {
@@ -45,5 +75,17 @@ struct GroupIo<OutWord<F, LowChannel>> {
         uint8_t* q = row.p[0] + 2 * static_cast<std::size_t>(x);
         storeLanes(q, 32, WordLanes<F>::template word<LowChannel>(a));
         storeLanes(q + 16, 32, WordLanes<F>::template word<LowChannel>(b));
+    }
+};
+
+template <class F, int LowChannel>
+struct GroupIo<OutDitherWord<F, LowChannel>> {
+    using D = OutDitherWord<F, LowChannel>;
+    static void put(const typename D::Row& row, int x, const V3& a, const V3& b, const Ctx&)
+    {
+        uint8_t* q = row.p[0] + 2 * static_cast<std::size_t>(x);
+        const V t = ditherLanes<D>(row, x);
+        storeLanes(q, 32, WordLanes<F>::template ditheredWord<LowChannel>(a, t));
+        storeLanes(q + 16, 32, WordLanes<F>::template ditheredWord<LowChannel>(b, t));
     }
 };

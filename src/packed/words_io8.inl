@@ -17,3 +17,12 @@ struct Io8<OutWord<F, LowChannel>> {
         store16(row.p[0] + 2 * static_cast<std::size_t>(x), WordLanes<F>::template word<LowChannel>(v));
     }
 };
+
+template <class F, int LowChannel>
+struct Io8<OutDitherWord<F, LowChannel>> {
+    using D = OutDitherWord<F, LowChannel>;
+    static void put(const typename D::Row& row, int x, const V3& v, const Ctx&)
+    {
+        store16(row.p[0] + 2 * static_cast<std::size_t>(x), WordLanes<F>::template ditheredWord<LowChannel>(v, ditherLanes<D>(row, x)));
+    }
+};

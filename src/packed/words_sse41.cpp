@@ -6,6 +6,7 @@
 namespace zox::sse41 {
 #include "packed/words_io.inl"
 #include "packed/words_io8.inl"
+#include "lumachroma/inverse_simd.inl"
 #include "packed/words_simd.inl"
 
 ZOX_WORDS_OWN(ZOX_INSTANTIATE_KERNELS)

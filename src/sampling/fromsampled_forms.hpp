@@ -36,13 +36,14 @@ struct RgbFromYccSplit {
     }
 };
 
-// Wide: 16 Y with no offset, chroma at 128 x into multiply-highs, rounded over 16. Green gathers its
-// products as a sum, or subtracts those formed with the positive gains (each floor falls the other way).
-template <const YuvInverseGains& K, Green G>
+// Wide: 16 Y with no offset, chroma at 128 x into multiply-highs, over 16 after the bias R (8 rounded, 0
+// truncated). Green gathers its products as a sum, or subtracts those formed with the positive gains
+// (each floor falls the other way).
+template <const YuvInverseGains& K, Green G, int R = 8>
 struct RgbFromWide {
     static Px apply(const Px& p)
     {
-        const int y = 16 * p.c[0] + 8, a = 128 * (p.c[1] - 128), b = 128 * (p.c[2] - 128);
+        const int y = 16 * p.c[0] + R, a = 128 * (p.c[1] - 128), b = 128 * (p.c[2] - 128);
         const int green = G == Green::Sum ? y + mulHigh(a, K.uG) + mulHigh(b, K.vG) : y - mulHigh(a, -K.uG) - mulHigh(b, -K.vG);
         return {{clip8((y + mulHigh(b, K.vR)) >> 4), clip8(green >> 4), clip8((y + mulHigh(a, K.uB)) >> 4)}, p.extra};
     }

@@ -26,10 +26,10 @@ struct InverseSimd<RgbFromYccSplit<K>> {
     }
 };
 
-template <const YuvInverseGains& K, Green G>
-struct InverseSimd<RgbFromWide<K, G>> {
+template <const YuvInverseGains& K, Green G, int R>
+struct InverseSimd<RgbFromWide<K, G, R>> {
     static constexpr int shift = 4;
-    static V luma(V y) { return add(shl<4>(y), splat16<8>()); }
+    static V luma(V y) { return R == 0 ? shl<4>(y) : add(shl<4>(y), splat16<R>()); }
     static InverseTerms chroma(V cb, V cr)
     {
         const V a = shl<7>(sub(cb, splat16<128>())), b = shl<7>(sub(cr, splat16<128>()));

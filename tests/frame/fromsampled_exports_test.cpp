@@ -11,6 +11,7 @@ using namespace zox;
 #define ZT_FROM_SWEEP(name, shape, Src, Dst, Lim, Block, Rem, Last, Rules) \
     TEST(FromSampledSweep, name) { zt::sweepFromSampled<ZT_FROM_ROW(Src, Dst, Lim, Block, Rem, Last), Rules, ZT_FROM_SHAPE(shape)>(#name, &name); }
 ZOX_FROM_SAMPLED_OWN_TABLE(ZT_FROM_SWEEP)
+ZOX_WORDS_SAMPLED_TABLE(ZT_FROM_SWEEP)
 
 #define ZT_FROM_VALIDATION(name, shape, Src, Dst, Lim, Block, Rem, Last, Rules)                                         \
     TEST(FromSampledValidation, name)                                                                                    \
@@ -18,6 +19,7 @@ ZOX_FROM_SAMPLED_OWN_TABLE(ZT_FROM_SWEEP)
         zt::checkFromSampledValidation<ZT_FROM_ROW(Src, Dst, Lim, Block, Rem, Last), Rules, ZT_FROM_SHAPE(shape)>(#name, &name); \
     }
 ZOX_FROM_SAMPLED_TABLE(ZT_FROM_VALIDATION)
+ZOX_WORDS_SAMPLED_TABLE(ZT_FROM_VALIDATION)
 
 #define ZT_FROM_KERNELS(name, shape, Src, Dst, Lim, Block, Rem, Last, Rules)                                \
     TEST(FromSampledKernelsAgainstForms, name)                                                              \
@@ -27,3 +29,4 @@ ZOX_FROM_SAMPLED_TABLE(ZT_FROM_VALIDATION)
             zt::diffFromSampledKernels<ZT_FROM_ROW(Src, Dst, Lim, Block, Rem, Last)::Aligned>();            \
     }
 ZOX_FROM_SAMPLED_OWN_TABLE(ZT_FROM_KERNELS)
+ZOX_WORDS_SAMPLED_TABLE(ZT_FROM_KERNELS)
