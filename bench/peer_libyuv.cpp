@@ -97,6 +97,21 @@ void registerLibyuvPeers()
                          const int w = s.width, h = s.height;
                          libyuv::I422ToRGB24(in, w, in + w * h, w / 2, in + w * h + w / 2 * h, w / 2, o, 3 * w, w, h);
                      });
+        // Sixteen-bit words: 4:2:0 planes in, plain and dithered; words to and from pixels.
+        unsamplePeer("libyuv I420ToRGB565", {"zoxiYCbCr420ToBGR565_8u16u_P3C3R", "zoxiYUV420ToRGB565_8u16u_P3C3R"}, size,
+                     luma + 2 * q, 2 * luma, [](const uint8_t* in, uint8_t* o, Size s) {
+                         const int w = s.width, h = s.height;
+                         libyuv::I420ToRGB565(in, w, in + w * h, w / 2, in + w * h + w / 2 * (h / 2), w / 2, o, 2 * w, w, h);
+                     });
+        unsamplePeer("libyuv I420ToRGB565Dither", {"zoxiYCbCr420ToBGR565Dither_8u16u_P3C3R"}, size, luma + 2 * q, 2 * luma,
+                     [](const uint8_t* in, uint8_t* o, Size s) {
+                         const int w = s.width, h = s.height;
+                         libyuv::I420ToRGB565Dither(in, w, in + w * h, w / 2, in + w * h + w / 2 * (h / 2), w / 2, o, 2 * w, nullptr, w, h);
+                     });
+        unsamplePeer("libyuv ARGBToRGB565", {"zoxiBGRToBGR565_8u16u_C3R"}, size, 4 * luma, 2 * luma,
+                     [](const uint8_t* in, uint8_t* o, Size s) { libyuv::ARGBToRGB565(in, 4 * s.width, o, 2 * s.width, s.width, s.height); });
+        unsamplePeer("libyuv RGB565ToARGB", {"zoxiBGR565ToBGR_16u8u_C3R"}, size, 2 * luma, 4 * luma,
+                     [](const uint8_t* in, uint8_t* o, Size s) { libyuv::RGB565ToARGB(in, 2 * s.width, o, 4 * s.width, s.width, s.height); });
         // Repacking.
         unsamplePeer("libyuv NV12ToI420", {"zoxiYCbCr420_8u_P2P3R"}, size, luma + 2 * q, luma + 2 * q,
                      [](const uint8_t* in, uint8_t* o, Size s) {

@@ -28,7 +28,7 @@ struct SourceImage {
     typename Src::Arg arg()
     {
         if constexpr (Src::planes == 1)
-            return ptrs[0];
+            return reinterpret_cast<typename Src::Arg>(ptrs[0]);
         else
             return ptrs.data();
     }
@@ -121,7 +121,7 @@ struct PixelImage {
     typename Dst::Arg arg()
     {
         if constexpr (Dst::planes == 1)
-            return ptr[0];
+            return reinterpret_cast<typename Dst::Arg>(ptr[0]);
         else
             return ptr;
     }
@@ -220,10 +220,12 @@ void registerSampledFamilies()
 #define ZB_SAMPLED(name, shape, Src, Dst, Lim, Block, Rem, Tail, Rules) \
     registerSampled<SampledRow<Src, Dst, Lim, Block, Rem, Tail>>(#name, &name);
     ZOX_TO_SAMPLED_TABLE(ZB_SAMPLED)
+    ZOX_WORDS_TO_SAMPLED_TABLE(ZB_SAMPLED)
 #undef ZB_SAMPLED
 #define ZB_FROM_SAMPLED(name, shape, Src, Dst, Lim, Block, Rem, Last, Rules) \
     registerFromSampled<FromSampledRow<Src, Dst, Lim, Block, Rem, Last>>(#name, &name);
     ZOX_FROM_SAMPLED_TABLE(ZB_FROM_SAMPLED)
+    ZOX_WORDS_SAMPLED_TABLE(ZB_FROM_SAMPLED)
 #undef ZB_FROM_SAMPLED
 #define ZB_REPACK(name, shape, Src, Dst, Rule, Class, Stream) registerRepack<ZOX_REPACK(Src, Dst, Rule, Class, Stream)>(#name, &name);
     ZOX_REPACK_TABLE(ZB_REPACK)

@@ -427,6 +427,46 @@ ZOXCC_API zoxStatus zoxiYCbCrToRGB444_8u16u_P3C3R(const uint8_t* const src[3], i
 ZOXCC_API zoxStatus zoxiYCbCrToRGB555_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
 ZOXCC_API zoxStatus zoxiYCbCrToRGB565_8u16u_P3C3R(const uint8_t* const src[3], int srcStep, uint16_t* dst, int dstStep, ImageSize roiSize);
 
+/* ---- Sixteen-bit RGB words to chroma-sampled images ------------------------------------------------------
+ * BGR555 and BGR565 words (red in the high field; bit 15 of 555 ignored) to studio-range YCbCr, and BGR
+ * words and RGB565 words (red in the low field) to YUV. Fields grow by a bare shift (r, g, b below).
+ * YCbCr forms: block luma Y = (mulHighU(r << 8, 8422) + mulHighU(g << 8, 16515) + mulHighU(b << 8, 3212)
+ * + 2112) >> 7; block chroma of the channel sums sr, sg, sb over a group of 4 (4:2:0, 4:1:1), x = s << 5:
+ * Cb = (mulHighU(xb, 28770) - mulHighU(xr, 9699) - mulHighU(xg, 19071) + 16400) >> 7, Cr = (mulHighU(xr,
+ * 28770) - mulHighU(xg, 24117) - mulHighU(xb, 4653) + 16400) >> 7 (a pair: 8200 and >> 6); pixel luma
+ * Y = (16843 r + 33030 g + 6423 b + 0x108000) >> 16; pixel chroma Cb = ((28770 sb - 19071 sg - 9699 sr +
+ * 0x8000) >> 18) + 128 (a pair: 0x4000, >> 17; one pixel: 0x2000, >> 16), Cr alike with 28770, -24117,
+ * -4653. Block forms take columns below (w & ~15) + (w & 4) in 4:2:0, (w & ~31) + (w & 8) in 4:2:2 and
+ * w & ~3 in 4:1:1, pixel forms the groups up to w & ~1. A last odd column and a 4:2:0 last odd row take
+ * pixel luma and no chroma (the packed 4:2:2 member writes the one-pixel Cb in the column's second
+ * byte); 4:1:1 from BGR555 gives the last w & 3 columns pixel luma, from BGR565 leaves them unwritten.
+ * YUV 4:2:0 from BGR words: block Y = (mulHighU(r << 8, 9798) + mulHighU(g << 8, 19235) + mulHighU(b << 8,
+ * 3736) + 64) >> 7, S = 32 x the four Y, U = clip8((mulHigh(32 sb - S, 16122) + 8224) >> 6), V alike with
+ * sr and 28737, below w & ~3; pixel q = 19595 r + 38470 g + 7471 b, Y = (q + 0x8000) >> 16, with Q the
+ * four q U = ((((sb << 16) - Q + 0x1ffff) >> 16) * 32244 >> 18) + 128, V = clip8(... 57475 ...); the
+ * second row of a pair at srcStep & ~1 past the first. YUV from RGB565: y2 = mulHigh(r << 2, 9798) +
+ * mulHigh(b << 2, 3736) + mulHigh(g << 2, 19235), Y = clip8((y2 + 1) >> 1), D = (sum of y2) >> 2 (a pair:
+ * >> 1), U = clip8(mulHigh((sb >> 1) - D, 16121) + 128) (a pair: sb - D), V alike with sr and 28737,
+ * below w & ~15; pixel Y = q >> 16 and the chroma above (a pair: 0xffff, >> 17). YUV members leave a
+ * last odd column and row unwritten. Checks: src, dst, each plane, then sizes (below 4 wide for 4:1:1,
+ * 2 x 2 for 4:2:0, 2 wide for 4:2:2); RGB565 members check sizes (below 1) before the planes.
+ * zoxWarnOddSize: 4:1:1 when w & 3, YUV 4:2:0 when w or h is odd, RGB565 to YUV 4:2:2 when w is odd.
+ * Source steps are taken as they come. */
+ZOXCC_API zoxStatus zoxiBGR555ToYCbCr411_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGR565ToYCbCr411_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGR555ToYCbCr420_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGR565ToYCbCr420_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGR555ToYCrCb420_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGR565ToYCrCb420_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGR555ToYCbCr422_16u8u_C3C2R(const uint16_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGR565ToYCbCr422_16u8u_C3C2R(const uint16_t* src, int srcStep, uint8_t* dst, int dstStep, ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGR555ToYCbCr422_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGR565ToYCbCr422_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGR555ToYUV420_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiBGR565ToYUV420_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGB565ToYUV420_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+ZOXCC_API zoxStatus zoxiRGB565ToYUV422_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
+
 /* ---- Sixteen-bit RGB words from chroma-sampled images --------------------------------------------------
  * Y, Cb, Cr at studio range (or Y, U, V) to the words above. Chroma: packed 4:2:2 (Y0 Cb Y1 Cr, 2w bytes a
  * row) and 4:2:2 planes ((w + 1) / 2 samples a row) serve columns 2i, 2i + 1 from sample i; 4:2:0 planes

@@ -173,10 +173,9 @@ inline V max16(V a, V b) { return _mm_max_epi16(a, b); }
 
 // Unsigned 16-bit saturating sums.
 inline V addSatU(V a, V b) { return _mm_adds_epu16(a, b); }
-inline V subSatU(V a, V b) { return _mm_subs_epu16(a, b); }
-// The low 16 bits of each product; all-ones lanes where a equals b.
+// The low 16 bits of each product; all-ones lanes where a is above b (signed).
 inline V mulLo(V a, V b) { return _mm_mullo_epi16(a, b); }
-inline V cmpEq16(V a, V b) { return _mm_cmpeq_epi16(a, b); }
+inline V cmpGt16(V a, V b) { return _mm_cmpgt_epi16(a, b); }
 
 // Single precision, four lanes: each operation rounded on its own in the caller's rounding mode. minF and
 // maxF are the processor's: a NaN in a gives b. toNearestInt rounds to nearest with ties to even whatever

@@ -207,9 +207,8 @@ inline V min16(V a, V b) { return _mm256_min_epi16(a, b); }
 inline V max16(V a, V b) { return _mm256_max_epi16(a, b); }
 
 inline V addSatU(V a, V b) { return _mm256_adds_epu16(a, b); }
-inline V subSatU(V a, V b) { return _mm256_subs_epu16(a, b); }
 inline V mulLo(V a, V b) { return _mm256_mullo_epi16(a, b); }
-inline V cmpEq16(V a, V b) { return _mm256_cmpeq_epi16(a, b); }
+inline V cmpGt16(V a, V b) { return _mm256_cmpgt_epi16(a, b); }
 
 // Single precision, eight lanes (see the SSE4.1 set); blendF and permuteF act within each 128-bit lane, and
 // the pixel-group loads and stores take the upper lane g bytes on.

@@ -4,8 +4,9 @@
 //
 // Column rule: units that begin before the row's limit column take the block form, the others the
 // remainder form; the pixels behind the last whole unit take the tail form, which says which of Y, Cb
-// and Cr it writes. A 4:2:0 image goes by row pairs: a last odd row, like a last odd column, is not
-// converted. Each form is defined once, in scalar code; a SIMD kernel is a checked fast path of the
+// and Cr it writes. A 4:2:0 image goes by row pairs; its tail form, where it has one, writes the luma
+// of a last odd column in both rows of each pair and of every pixel of a last odd row, else those are
+// not converted. Each form is defined once, in scalar code; a SIMD kernel is a checked fast path of the
 // block form over a prefix of the block units.
 #pragma once
 
@@ -285,16 +286,20 @@ void convertPass(const SourcePass<typename C::Src>& s, const SampledPass& d, int
     if constexpr (C::limit != Limit::None)
         scalarUnits<C, typename C::Block>(s, d, kernelUnits<C, K>(s, d, 0, nb, false), nb);
     scalarUnits<C, typename C::Rem>(s, d, kernelUnits<C, K>(s, d, nb, units, true), units);
-    if constexpr (C::Tail::writes != 0)
-        for (int x = units * C::uw; x < width; ++x) {
-            const Px o = C::Tail::apply(C::Src::load(s.r[0], x));
-            if constexpr (C::Tail::writes & WritesY)
-                C::Dst::storeY(d, 0, x, o.c[0]);
-            if constexpr (C::Tail::writes & WritesCb)
-                C::Dst::storeCb(d, units, o.c[1]);
-            if constexpr (C::Tail::writes & WritesCr)
-                C::Dst::storeCr(d, units, o.c[2]);
-        }
+    if constexpr (C::Tail::writes != 0) {
+        static_assert(C::sampling != Sampling::S420 || C::Tail::writes == WritesY, "a 4:2:0 tail writes luma only");
+        #pragma GCC unroll 2
+        for (int dy = 0; dy < C::uh; ++dy)
+            for (int x = units * C::uw; x < width; ++x) {
+                const Px o = C::Tail::apply(C::Src::load(s.r[dy], x));
+                if constexpr (C::Tail::writes & WritesY)
+                    C::Dst::storeY(d, dy, x, o.c[0]);
+                if constexpr (C::Tail::writes & WritesCb)
+                    C::Dst::storeCb(d, units, o.c[1]);
+                if constexpr (C::Tail::writes & WritesCr)
+                    C::Dst::storeCr(d, units, o.c[2]);
+            }
+    }
 }
 
 template <class C, KernelSet K>
@@ -307,6 +312,13 @@ void convertPasses(typename C::Src::Arg src, std::ptrdiff_t srcStep, const Sampl
         s.r[1] = C::Src::row(src, srcStep, C::uh * j + C::uh - 1);
         convertPass<C, K>(s, C::Dst::pass(dst, j), roi.width);
     }
+    if constexpr (C::sampling == Sampling::S420 && C::Tail::writes != 0)
+        if (roi.height & 1) { // a last odd row: the tail form in every column
+            const typename C::Src::Row s = C::Src::row(src, srcStep, roi.height - 1);
+            const SampledPass d = C::Dst::pass(dst, passes);
+            for (int x = 0; x < roi.width; ++x)
+                C::Dst::storeY(d, 0, x, C::Tail::apply(C::Src::load(s, x)).c[0]);
+        }
 }
 
 template <class C>

@@ -22,14 +22,15 @@ using Fields565 = WordFields<5, 6, 5>;
 using Fields555 = WordFields<5, 5, 5>;
 using Fields444 = WordFields<4, 4, 4>;
 
-// A source of words: channel 0 the low field, 1 the middle, 2 the high one, each shifted up to 8 bits
-// with zeros below (a 5-bit 31 gives 248).
-template <class F>
+// A source of words: the low field goes to channel LowChannel (0 or 2), the middle one to channel 1, the
+// high one to the other, each shifted up to 8 bits with zeros below (a 5-bit 31 gives 248).
+template <class F, int LowChannel = 0>
 struct InWord {
     using Fields = F;
     using Pixel = Px;
     static constexpr int planes = 1;
     static constexpr int bytesPerPixel = 2;
+    static constexpr int lowChannel = LowChannel;
     using Sample = uint16_t;
     using Arg = const uint16_t*;
     struct Row {
@@ -41,10 +42,23 @@ struct InWord {
     {
         uint16_t w;
         std::memcpy(&w, row.p[0] + 2 * static_cast<std::size_t>(x), 2);
-        const int lo = w & ((1 << F::low) - 1);
-        const int mid = (w >> F::low) & ((1 << F::mid) - 1);
-        const int hi = (w >> (F::low + F::mid)) & ((1 << F::high) - 1);
-        return {{lo << (8 - F::low), mid << (8 - F::mid), hi << (8 - F::high)}, 0};
+        const int lo = (w & ((1 << F::low) - 1)) << (8 - F::low);
+        const int mid = ((w >> F::low) & ((1 << F::mid) - 1)) << (8 - F::mid);
+        const int hi = ((w >> (F::low + F::mid)) & ((1 << F::high) - 1)) << (8 - F::high);
+        return LowChannel == 0 ? Pixel{{lo, mid, hi}, 0} : Pixel{{hi, mid, lo}, 0};
+    }
+};
+
+// A source read in row pairs whose second row lies the step rounded down to even bytes past the first
+// (row 2j at 2j x step, row 2j + 1 at 2j x step + (step & ~1)).
+template <class Src>
+struct InEvenPairStep : Src {
+    static typename Src::Row row(typename Src::Arg a, std::ptrdiff_t step, int r)
+    {
+        typename Src::Row first = Src::row(a, step, r & ~1);
+        if (r & 1)
+            first.p[0] += step & ~std::ptrdiff_t{1};
+        return first;
     }
 };
 

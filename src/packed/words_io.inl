@@ -24,17 +24,16 @@ struct WordLanes {
         const V hi = shrU<8 - F::high>(clip(v.c[2 - LowChannel]));
         return or_(or_(lo, shl<F::low>(mid)), shl<F::low + F::mid>(hi));
     }
-    // One channel quantised against the thresholds t: q = (n c) >> 8, e = (c << 8) - s q (both exact in
-    // unsigned 16-bit lanes), and q + 1 where e is above the threshold. The saturating difference e - t is
-    // 0 exactly where e is not above it; the all-ones compare then takes the 1 back.
+    // One channel quantised against the thresholds t: q = (n c) >> 8 as the high half of c times 256 n,
+    // e = (c << 8) - s q, and q + 1 where e is above the threshold. e lies in 0..4352, so a signed compare
+    // serves, and its all-ones lanes subtract as 1.
     template <int Bits>
     static V quantised(V c, V t)
     {
         using Ch = dither::Channel<Bits>;
-        const V q = shrU<8>(mulLo(c, splat16(Ch::n)));
+        const V q = mulHighU(c, splat16(Ch::n << 8));
         const V e = sub(shl<8>(c), mulLo(q, splat16(Ch::s)));
-        const V th = Ch::thresholdShift ? shrU<1>(t) : t;
-        return add(add(q, splat16(1)), cmpEq16(subSatU(e, th), zero()));
+        return sub(q, cmpGt16(e, Ch::thresholdShift ? shrU<1>(t) : t));
     }
     // Eight dithered words, channels limited to 0..255 first.
     template <int LowChannel>
@@ -56,17 +55,30 @@ inline V ditherLanes(const typename L::Row& row, int x)
     return loadLanes(reinterpret_cast<const uint8_t*>(row.lanes[x & 3]), 0);
 }
 
-template <class F>
-struct GroupIo<InWord<F>> {
+// The fields of eight words with the low field in channel L.
+template <class F, int L>
+inline V3 wordChannels(V w)
+{
+    V3 v = WordLanes<F>::fields(w);
+    if constexpr (L == 2)
+        std::swap(v.c[0], v.c[2]);
+    return v;
+}
+
+template <class F, int L>
+struct GroupIo<InWord<F, L>> {
     template <int Shift>
-    static void get(const typename InWord<F>::Row& row, int x, V3& a, V3& b)
+    static void get(const typename InWord<F, L>::Row& row, int x, V3& a, V3& b)
     {
         static_assert(Shift == 0, "words fill the low byte of their lanes");
         const uint8_t* q = row.p[0] + 2 * static_cast<std::size_t>(x);
-        a = WordLanes<F>::fields(loadLanes(q, 32));
-        b = WordLanes<F>::fields(loadLanes(q + 16, 32));
+        a = wordChannels<F, L>(loadLanes(q, 32));
+        b = wordChannels<F, L>(loadLanes(q + 16, 32));
     }
 };
+
+template <class Src>
+struct GroupIo<InEvenPairStep<Src>> : GroupIo<Src> {};
 
 template <class F, int LowChannel>
 struct GroupIo<OutWord<F, LowChannel>> {

@@ -1,12 +1,12 @@
 // Eight words at a time, for the shorter groups of the 128-bit block kernels (after conv128.inl).
 
-template <class F>
-struct Io8<InWord<F>> {
+template <class F, int L>
+struct Io8<InWord<F, L>> {
     template <int Shift>
-    static V3 get(const typename InWord<F>::Row& row, int x)
+    static V3 get(const typename InWord<F, L>::Row& row, int x)
     {
         static_assert(Shift == 0, "words fill the low byte of their lanes");
-        return WordLanes<F>::fields(load16(row.p[0] + 2 * static_cast<std::size_t>(x)));
+        return wordChannels<F, L>(load16(row.p[0] + 2 * static_cast<std::size_t>(x)));
     }
 };
 

@@ -250,27 +250,54 @@ struct YuvDifferenceUnit {
 // Unit of 4 in 1/16384, truncated; in 1/65536 with the differences rounded up.
 using YuvY14Unit = YuvDifferenceUnit<4, YuvY14Gains, 14, 0, 0, 16>;
 using YuvY16Unit = YuvDifferenceUnit<4, YuvDifferenceForward, 16, 0, 131071, 18>;
+using YuvY16RoundedUnit = YuvDifferenceUnit<4, YuvDifferenceForward, 16, 32768, 131071, 18>;
 // Pairs in 1/65536: full rounding, or truncated luma with the differences rounded up.
 template <bool Full>
 using YuvD422Unit = YuvDifferenceUnit<2, YuvDifferenceForward, 16, Full ? 32768 : 0, Full ? 32768 : 65535, 17>;
 
-// H420, unit of 4: multiply-highs of 4 x sample; chroma of half sums less a quarter of the four lumas.
-struct YuvH420Block {
+// Half forms: each pixel's luma term y from multiply-highs of 4 x sample, Y = (y + R) >> 1; chroma of
+// the unit's sums less its mean term, D = (sum of y) >> 2 against half sums over 4 pixels (H420), or
+// (sum of y) >> 1 against whole sums over a pair.
+template <int n, int R>
+struct YuvHalfBlock {
     using K = YuvHalfForward;
     static UnitOut apply(const Unit& u)
     {
         UnitOut o{};
         int t = 0;
-        for (int k = 0; k < 4; ++k) {
+        for (int k = 0; k < n; ++k) {
             const Px& p = u.p[k];
             const int y = mulHigh(4 * p.c[0], K::yR) + mulHigh(4 * p.c[2], K::yB) + mulHigh(4 * p.c[1], K::yG);
-            o.y[k] = clip8(y >> 1);
+            o.y[k] = clip8((y + R) >> 1);
             t += y;
         }
+        const UnitSums<n> s(u);
+        const int d = n == 4 ? t >> 2 : t >> 1;
+        o.cb = clip8(mulHigh((n == 4 ? s.b >> 1 : s.b) - d, K::uGain) + 128);
+        o.cr = clip8(mulHigh((n == 4 ? s.r >> 1 : s.r) - d, K::vGain) + 128);
+        return o;
+    }
+};
+using YuvH420Block = YuvHalfBlock<4, 0>;
+
+// Sum form, unit of 4: each Y from unsigned multiply-highs of 256 x sample, rounded over 128; chroma of
+// 32 x sums less 32 x the sum of the four Y through signed multiply-highs, with 128 and the rounding unit
+// over 64.
+struct YuvSumBlock {
+    static constexpr int yR = 9798, yG = 19235, yB = 3736, uGain = 16122, vGain = 28737;
+    static constexpr int luma(const Px& p)
+    {
+        return (mulHighU(256 * p.c[0], yR) + mulHighU(256 * p.c[1], yG) + mulHighU(256 * p.c[2], yB) + 64) >> 7;
+    }
+    static UnitOut apply(const Unit& u)
+    {
+        UnitOut o{};
+        int sy = 0;
+        for (int k = 0; k < 4; ++k)
+            sy += o.y[k] = luma(u.p[k]);
         const UnitSums<4> s(u);
-        const int q = t >> 2;
-        o.cb = clip8(mulHigh((s.b >> 1) - q, K::uGain) + 128);
-        o.cr = clip8(mulHigh((s.r >> 1) - q, K::vGain) + 128);
+        o.cb = clip8((mulHigh(32 * s.b - 32 * sy, uGain) + 8224) >> 6);
+        o.cr = clip8((mulHigh(32 * s.r - 32 * sy, vGain) + 8224) >> 6);
         return o;
     }
 };

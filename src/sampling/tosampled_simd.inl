@@ -43,9 +43,9 @@ struct SimdUnit<YuvR420Block> {
     }
 };
 
-template <>
-struct SimdUnit<YuvH420Block> {
-    static constexpr int pixels = 4;
+template <int n, int R>
+struct SimdUnit<YuvHalfBlock<n, R>> {
+    static constexpr int pixels = n;
     static constexpr bool lumaSums = true;
     using K = YuvHalfForward;
     static V luma(const V3& v)
@@ -53,12 +53,33 @@ struct SimdUnit<YuvH420Block> {
         return add(add(mulHigh(shl<2>(v.c[0]), splat16<K::yR>()), mulHigh(shl<2>(v.c[2]), splat16<K::yB>())),
                    mulHigh(shl<2>(v.c[1]), splat16<K::yG>()));
     }
-    static V lumaOut(V t) { return shr<1>(t); }
+    static V lumaOut(V t) { return shr<1>(R == 0 ? t : add(t, splat16<R>())); }
     static void chroma(const V3& s, V t, V& cb, V& cr)
     {
-        const V q = shr<2>(t);
-        cb = add(mulHigh(sub(shr<1>(s.c[2]), q), splat16<K::uGain>()), splat16<128>());
-        cr = add(mulHigh(sub(shr<1>(s.c[0]), q), splat16<K::vGain>()), splat16<128>());
+        const V d = n == 4 ? shr<2>(t) : shr<1>(t);
+        cb = add(mulHigh(sub(n == 4 ? shr<1>(s.c[2]) : s.c[2], d), splat16<K::uGain>()), splat16<128>());
+        cr = add(mulHigh(sub(n == 4 ? shr<1>(s.c[0]) : s.c[0], d), splat16<K::vGain>()), splat16<128>());
+    }
+};
+
+// The luma terms are the lumas themselves, so that their unit sums come with them.
+template <>
+struct SimdUnit<YuvSumBlock> {
+    static constexpr int pixels = 4;
+    static constexpr bool lumaSums = true;
+    using F = YuvSumBlock;
+    static V luma(const V3& v)
+    {
+        return shr<7>(add(add(add(mulHighU(shl<8>(v.c[0]), splat16<F::yR>()), mulHighU(shl<8>(v.c[1]), splat16<F::yG>())),
+                              mulHighU(shl<8>(v.c[2]), splat16<F::yB>())),
+                          splat16<64>()));
+    }
+    static V lumaOut(V t) { return t; }
+    static void chroma(const V3& s, V t, V& cb, V& cr)
+    {
+        const V sy = shl<5>(t);
+        cb = shr<6>(add(mulHigh(sub(shl<5>(s.c[2]), sy), splat16<F::uGain>()), splat16<8224>()));
+        cr = shr<6>(add(mulHigh(sub(shl<5>(s.c[0]), sy), splat16<F::vGain>()), splat16<8224>()));
     }
 };
 

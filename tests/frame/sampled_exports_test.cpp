@@ -11,10 +11,12 @@ using namespace zox;
 #define ZT_SWEEP(name, shape, Src, Dst, Lim, Block, Rem, Tail, Rules) \
     TEST(SampledSweep, name) { zt::sweepSampled<ZT_ROW(Src, Dst, Lim, Block, Rem, Tail), Rules, ZT_SHAPE(shape)>(#name, &name); }
 ZOX_TO_SAMPLED_OWN_TABLE(ZT_SWEEP)
+ZOX_WORDS_TO_SAMPLED_TABLE(ZT_SWEEP)
 
 #define ZT_VALIDATION(name, shape, Src, Dst, Lim, Block, Rem, Tail, Rules) \
     TEST(SampledValidation, name) { zt::checkSampledValidation<ZT_ROW(Src, Dst, Lim, Block, Rem, Tail), Rules, ZT_SHAPE(shape)>(#name, &name); }
 ZOX_TO_SAMPLED_TABLE(ZT_VALIDATION)
+ZOX_WORDS_TO_SAMPLED_TABLE(ZT_VALIDATION)
 
 #define ZT_KERNELS(name, shape, Src, Dst, Lim, Block, Rem, Tail, Rules)                                     \
     TEST(SampledKernelsAgainstForms, name)                                                                  \
@@ -24,4 +26,5 @@ ZOX_TO_SAMPLED_TABLE(ZT_VALIDATION)
             zt::diffSampledKernels<ZT_ROW(Src, Dst, Lim, Block, Rem, Tail)::Aligned>();                     \
     }
 ZOX_TO_SAMPLED_OWN_TABLE(ZT_KERNELS)
+ZOX_WORDS_TO_SAMPLED_OWN(ZT_KERNELS)
 

@@ -290,6 +290,7 @@ const std::vector<FamilyDemo>& familyDemos()
         {"Repacking among samplings and layouts", repackDemo},
         {"Gray conversions", grayDemo},
         {"Colour twist", twistDemo},
+        {"Sixteen-bit RGB words, plain and dithered", wordsDemo},
     };
     return demos;
 }

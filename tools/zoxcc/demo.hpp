@@ -44,5 +44,6 @@ const std::vector<FamilyDemo>& familyDemos();
 // Families whose demos live in files of their own.
 void grayDemo(Demo& d);
 void twistDemo(Demo& d);
+void wordsDemo(Demo& d);
 
 } // namespace zt
