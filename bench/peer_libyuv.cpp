@@ -73,6 +73,11 @@ void registerLibyuvPeers()
                        const int w = s.width, h = s.height;
                        libyuv::ARGBToNV12(in, step, o, w, o + w * h, w, w, h);
                    });
+        samplePeer("libyuv RGB565ToI420", {"zoxiRGB565ToYUV420_16u8u_C3P3R", "zoxiBGR565ToYCbCr420_16u8u_C3P3R"}, size, 2,
+                   luma + 2 * q, [](const uint8_t* in, int step, uint8_t* o, Size s) {
+                       const int w = s.width, h = s.height;
+                       libyuv::RGB565ToI420(in, step, o, w, o + w * h, w / 2, o + w * h + w / 2 * (h / 2), w / 2, w, h);
+                   });
         samplePeer("libyuv ARGBToYUY2", {"zoxiRGBToYCbCr422_8u_C3C2R"}, size, 4, 2 * luma,
                    [](const uint8_t* in, int step, uint8_t* o, Size s) {
                        libyuv::ARGBToYUY2(in, step, o, s.width * 2, s.width, s.height);

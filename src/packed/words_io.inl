@@ -24,26 +24,38 @@ struct WordLanes {
         const V hi = shrU<8 - F::high>(clip(v.c[2 - LowChannel]));
         return or_(or_(lo, shl<F::low>(mid)), shl<F::low + F::mid>(hi));
     }
-    // One channel quantised against the thresholds t: q = (n c) >> 8 as the high half of c times 256 n,
-    // e = (c << 8) - s q, and q + 1 where e is above the threshold. e lies in 0..4352, so a signed compare
-    // serves, and its all-ones lanes subtract as 1.
+    // One channel at 256 x (c8 = c << 8, c in 0..255) quantised against the thresholds t: q = (n c) >> 8 as
+    // the high half of c8 times n, e = (c << 8) - s q, and q + 1 where e is above the threshold. e lies in
+    // 0..4352, so a signed compare serves, and its all-ones lanes subtract as 1.
     template <int Bits>
-    static V quantised(V c, V t)
+    static V quantised(V c8, V t)
     {
         using Ch = dither::Channel<Bits>;
-        const V q = mulHighU(c, splat16(Ch::n << 8));
-        const V e = sub(shl<8>(c), mulLo(q, splat16(Ch::s)));
+        const V q = mulHighU(c8, splat16(Ch::n));
+        const V e = sub(c8, mulLo(q, splat16(Ch::s)));
         return sub(q, cmpGt16(e, Ch::thresholdShift ? shrU<1>(t) : t));
     }
-    // Eight dithered words, channels limited to 0..255 first.
     template <int LowChannel>
-    static V ditheredWord(const V3& v, V t)
+    static V fieldsToWord(const V (&f)[3])
     {
-        auto clip = [](V x) { return max16(min16(x, splat16(255)), zero()); };
-        const V lo = quantised<F::low>(clip(v.c[LowChannel]), t);
-        const V mid = quantised<F::mid>(clip(v.c[1]), t);
-        const V hi = quantised<F::high>(clip(v.c[2 - LowChannel]), t);
-        return or_(or_(lo, shl<F::low>(mid)), shl<F::low + F::mid>(hi));
+        return or_(or_(f[LowChannel], shl<F::low>(f[1])), shl<F::low + F::mid>(f[2 - LowChannel]));
+    }
+    // Sixteen dithered words from two vectors of pixels: each channel limited to 0..255 by packing it to
+    // bytes, and unpacked again to 256 x.
+    template <int LowChannel>
+    [[gnu::always_inline]] static void ditheredWords(const V3& a, const V3& b, V t, V& wa, V& wb)
+    {
+        V fa[3], fb[3];
+        auto channel = [&]<int K, int Bits>() {
+            const V bytes = packUs(a.c[K], b.c[K]);
+            fa[K] = quantised<Bits>(unpackLo8(zero(), bytes), t);
+            fb[K] = quantised<Bits>(unpackHi8(zero(), bytes), t);
+        };
+        channel.template operator()<LowChannel, F::low>();
+        channel.template operator()<1, F::mid>();
+        channel.template operator()<2 - LowChannel, F::high>();
+        wa = fieldsToWord<LowChannel>(fa);
+        wb = fieldsToWord<LowChannel>(fb);
     }
 };
 
@@ -82,7 +94,7 @@ struct GroupIo<InEvenPairStep<Src>> : GroupIo<Src> {};
 
 template <class F, int LowChannel>
 struct GroupIo<OutWord<F, LowChannel>> {
-    static void put(const typename OutWord<F, LowChannel>::Row& row, int x, const V3& a, const V3& b, const Ctx&)
+    [[gnu::always_inline]] static void put(const typename OutWord<F, LowChannel>::Row& row, int x, const V3& a, const V3& b, const Ctx&)
     {
         uint8_t* q = row.p[0] + 2 * static_cast<std::size_t>(x);
         storeLanes(q, 32, WordLanes<F>::template word<LowChannel>(a));
@@ -93,11 +105,12 @@ struct GroupIo<OutWord<F, LowChannel>> {
 template <class F, int LowChannel>
 struct GroupIo<OutDitherWord<F, LowChannel>> {
     using D = OutDitherWord<F, LowChannel>;
-    static void put(const typename D::Row& row, int x, const V3& a, const V3& b, const Ctx&)
+    [[gnu::always_inline]] static void put(const typename D::Row& row, int x, const V3& a, const V3& b, const Ctx&)
     {
         uint8_t* q = row.p[0] + 2 * static_cast<std::size_t>(x);
-        const V t = ditherLanes<D>(row, x);
-        storeLanes(q, 32, WordLanes<F>::template ditheredWord<LowChannel>(a, t));
-        storeLanes(q + 16, 32, WordLanes<F>::template ditheredWord<LowChannel>(b, t));
+        V wa, wb;
+        WordLanes<F>::template ditheredWords<LowChannel>(a, b, ditherLanes<D>(row, x), wa, wb);
+        storeLanes(q, 32, wa);
+        storeLanes(q + 16, 32, wb);
     }
 };

@@ -23,6 +23,8 @@ struct Io8<OutDitherWord<F, LowChannel>> {
     using D = OutDitherWord<F, LowChannel>;
     static void put(const typename D::Row& row, int x, const V3& v, const Ctx&)
     {
-        store16(row.p[0] + 2 * static_cast<std::size_t>(x), WordLanes<F>::template ditheredWord<LowChannel>(v, ditherLanes<D>(row, x)));
+        V w, unused;
+        WordLanes<F>::template ditheredWords<LowChannel>(v, v, ditherLanes<D>(row, x), w, unused);
+        store16(row.p[0] + 2 * static_cast<std::size_t>(x), w);
     }
 };
