@@ -451,7 +451,7 @@ ZOXCC_API zoxStatus zoxiYCbCrToRGB565_8u16u_P3C3R(const uint8_t* const src[3], i
  * last odd column and row unwritten. Checks: src, dst, each plane, then sizes (below 4 wide for 4:1:1,
  * 2 x 2 for 4:2:0, 2 wide for 4:2:2); RGB565 members check sizes (below 1) before the planes.
  * zoxWarnOddSize: 4:1:1 when w & 3, YUV 4:2:0 when w or h is odd, RGB565 to YUV 4:2:2 when w is odd.
- * Source steps are taken as they come. */
+ * The YCrCb members name Cr's plane and step before Cb's. Source steps are taken as they come. */
 ZOXCC_API zoxStatus zoxiBGR555ToYCbCr411_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
 ZOXCC_API zoxStatus zoxiBGR565ToYCbCr411_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);
 ZOXCC_API zoxStatus zoxiBGR555ToYCbCr420_16u8u_C3P3R(const uint16_t* src, int srcStep, uint8_t* const dst[3], const int dstStep[3], ImageSize roiSize);

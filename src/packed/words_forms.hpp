@@ -22,21 +22,26 @@ using Fields565 = WordFields<5, 6, 5>;
 using Fields555 = WordFields<5, 5, 5>;
 using Fields444 = WordFields<4, 4, 4>;
 
-// A source of words: the low field goes to channel LowChannel (0 or 2), the middle one to channel 1, the
-// high one to the other, each shifted up to 8 bits with zeros below (a 5-bit 31 gives 248).
-template <class F, int LowChannel = 0>
-struct InWord {
+// What every side made of words shares: one plane of 16-bit samples, two bytes a pixel.
+template <class F>
+struct WordSide {
     using Fields = F;
     using Pixel = Px;
     static constexpr int planes = 1;
     static constexpr int bytesPerPixel = 2;
-    static constexpr int lowChannel = LowChannel;
     using Sample = uint16_t;
+    static constexpr bool planesValid(const void*) { return true; }
+};
+
+// A source of words: the low field goes to channel LowChannel (0 or 2), the middle one to channel 1, the
+// high one to the other, each shifted up to 8 bits with zeros below (a 5-bit 31 gives 248).
+template <class F, int LowChannel = 0>
+struct InWord : WordSide<F> {
+    using Pixel = Px;
     using Arg = const uint16_t*;
     struct Row {
         const uint8_t* p[1];
     };
-    static constexpr bool planesValid(Arg) { return true; }
     static Row row(Arg a, std::ptrdiff_t step, int r) { return {{rowAddress(reinterpret_cast<const uint8_t*>(a), step, r)}}; }
     static Pixel load(const Row& row, int x)
     {
@@ -65,16 +70,12 @@ struct InEvenPairStep : Src {
 // A destination of words: the low field takes channel LowChannel (0 or 2), the middle one channel 1,
 // the high one the other, each reduced from 0..255 by a truncating shift.
 template <class F, int LowChannel>
-struct OutWord {
+struct OutWord : WordSide<F> {
     using Pixel = Px;
-    static constexpr int planes = 1;
-    static constexpr int bytesPerPixel = 2;
-    using Sample = uint16_t;
     using Arg = uint16_t*;
     struct Row {
         uint8_t* p[1];
     };
-    static constexpr bool planesValid(Arg) { return true; }
     static Row row(Arg a, std::ptrdiff_t step, int r) { return {{rowAddress(reinterpret_cast<uint8_t*>(a), step, r)}}; }
     static void store(const Row& row, int x, const Pixel& px, const Ctx&)
     {
@@ -162,13 +163,8 @@ struct Channel {
 // A destination of dithered words: OutWord's fields, each quantised against the tile entry of the pixel's
 // column and row in the region. A row knows its tile row.
 template <class F, int LowChannel>
-struct OutDitherWord {
-    using Fields = F;
+struct OutDitherWord : WordSide<F> {
     using Pixel = Px;
-    static constexpr int planes = 1;
-    static constexpr int bytesPerPixel = 2;
-    static constexpr int lowChannel = LowChannel;
-    using Sample = uint16_t;
     using Arg = uint16_t*;
     static_assert(F::low == F::high && F::low <= F::mid);
     static constexpr const dither::Tile& tile = F::low == 4 ? dither::kTile4 : dither::kTile5;
@@ -176,7 +172,6 @@ struct OutDitherWord {
         uint8_t* p[1];
         const uint16_t (*lanes)[8]; // the tile row's four rotations
     };
-    static constexpr bool planesValid(Arg) { return true; }
     static Row row(Arg a, std::ptrdiff_t step, int r)
     {
         return {{rowAddress(reinterpret_cast<uint8_t*>(a), step, r)}, tile.lanes[r & 3]};
