@@ -218,6 +218,19 @@ void diffSampledKernels()
             }
         }
     }
+    if constexpr (requires { typename Src::Fields; }) { // every word once in each row
+        Side<Src> src(C::uh, 65536, 65536 * 2, 0, rng);
+        putEveryWord<Src>(src);
+        SampledSide<Dst> want(65536, C::uh, 0, 5, rng);
+        const auto before = want.bytes();
+        passesThrough<C>(zox::KernelSet::Portable, src.arg(), src.step, want.frame(), {65536, C::uh});
+        const auto expected = want.bytes();
+        for (zox::KernelSet k : sets) {
+            want.restore(before);
+            passesThrough<C>(k, src.arg(), src.step, want.frame(), {65536, C::uh});
+            ASSERT_EQ(want.bytes(), expected) << zox::kernelSetName(k) << ": every word";
+        }
+    }
 }
 
 } // namespace zt

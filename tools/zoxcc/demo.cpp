@@ -41,9 +41,9 @@ bool Demo::write(const std::string& file, const Image& img)
 
 void Demo::printTable() const
 {
-    std::printf("%-36s %10s %12s\n", "conversion", "best ms", "MB/s in+out");
+    std::printf("%-40s %10s %12s\n", "conversion", "best ms", "MB/s in+out");
     for (const Row& r : rows_)
-        std::printf("%-36s %10.3f %12.0f\n", r.name.c_str(), r.ms, r.mbps);
+        std::printf("%-40s %10.3f %12.0f\n", r.name.c_str(), r.ms, r.mbps);
     std::printf("\nwrote %zu images to %s:", files_.size(), dir_.c_str());
     for (const auto& f : files_)
         std::printf(" %s", f.c_str());
