@@ -113,7 +113,8 @@ struct LastPixel {
     using Odd = Odd_;
     using Single = Single_;
 };
-// The last pixel of an odd width is not written (as a form of LastPixel: those pixels are not written).
+// Pixels left unwritten: as a member's last-pixel form, an odd 4:2:2 width's last pixel and the 4:2:0
+// edges; inside LastPixel, the pixels that form would serve.
 struct Unwritten {};
 
 template <class Src_, class Dst_, Limit L_, class Block_, class Rem_, class Last_, int Variant_ = 0>
