@@ -98,8 +98,8 @@ FlatCall groupsCall(const char* name) // packed 4:2:2
 {
     return {name, [](int y, int cb, int cr, uint16_t* d, int ds, ImageSize roi) {
                 std::vector<uint8_t> src(2 * static_cast<std::size_t>(roi.width * roi.height));
-                for (std::size_t i = 0; i < src.size(); i += 4)
-                    src[i] = src[i + 2] = static_cast<uint8_t>(y), src[i + 1] = static_cast<uint8_t>(cb), src[i + 3] = static_cast<uint8_t>(cr);
+                for (std::size_t i = 0; i < src.size(); i += 2) // Y, then Cb in even columns and Cr in odd ones
+                    src[i] = static_cast<uint8_t>(y), src[i + 1] = static_cast<uint8_t>(i / 2 % roi.width % 2 ? cr : cb);
                 return F(src.data(), 2 * roi.width, d, ds, roi);
             }};
 }
