@@ -44,19 +44,23 @@ void wordsDemo(Demo& d)
     const int steps[3] = {y.step(), cb.step(), cr.step()};
     zoxiRGBToYCbCr420_8u_C3P3R(in.data(), in.step(), p, steps, roi);
     const uint8_t* c[3] = {p[0], p[1], p[2]};
-    const std::size_t planes = n * 3 / 2;
-    d.time("zoxiYCbCr420ToRGB565_8u16u_P3C3R", planes + n * 2,
-           [&] { return zoxiYCbCr420ToRGB565_8u16u_P3C3R(c, steps, words.data(), wordStep, roi); });
-    d.write("words-420-565.ppm", fromRgbWords(words, in.width, in.height, 5));
-    d.time("zoxiYCbCr420ToRGB565Dither_8u16u_P3C3R", planes + n * 2,
-           [&] { return zoxiYCbCr420ToRGB565Dither_8u16u_P3C3R(c, steps, words.data(), wordStep, roi); });
-    d.write("words-420-565-dither.ppm", fromRgbWords(words, in.width, in.height, 5));
-    d.time("zoxiYCbCr420ToRGB444_8u16u_P3C3R", planes + n * 2,
-           [&] { return zoxiYCbCr420ToRGB444_8u16u_P3C3R(c, steps, words.data(), wordStep, roi); });
-    d.write("words-420-444.ppm", fromRgbWords(words, in.width, in.height, 4));
-    d.time("zoxiYCbCr420ToRGB444Dither_8u16u_P3C3R", planes + n * 2,
-           [&] { return zoxiYCbCr420ToRGB444Dither_8u16u_P3C3R(c, steps, words.data(), wordStep, roi); });
-    d.write("words-420-444-dither.ppm", fromRgbWords(words, in.width, in.height, 4));
+    using FromPlanes = zoxStatus (*)(const uint8_t* const*, const int*, uint16_t*, int, ImageSize);
+    struct Run {
+        const char* name;
+        FromPlanes f;
+        const char* file;
+        int bits;
+    };
+    const Run runs[] = {
+        {"zoxiYCbCr420ToRGB565_8u16u_P3C3R", zoxiYCbCr420ToRGB565_8u16u_P3C3R, "words-420-565.ppm", 5},
+        {"zoxiYCbCr420ToRGB565Dither_8u16u_P3C3R", zoxiYCbCr420ToRGB565Dither_8u16u_P3C3R, "words-420-565-dither.ppm", 5},
+        {"zoxiYCbCr420ToRGB444_8u16u_P3C3R", zoxiYCbCr420ToRGB444_8u16u_P3C3R, "words-420-444.ppm", 4},
+        {"zoxiYCbCr420ToRGB444Dither_8u16u_P3C3R", zoxiYCbCr420ToRGB444Dither_8u16u_P3C3R, "words-420-444-dither.ppm", 4},
+    };
+    for (const Run& r : runs) {
+        d.time(r.name, n * 3 / 2 + n * 2, [&] { return r.f(c, steps, words.data(), wordStep, roi); });
+        d.write(r.file, fromRgbWords(words, in.width, in.height, r.bits));
+    }
 }
 
 } // namespace zt
